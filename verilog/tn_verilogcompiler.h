@@ -1,0 +1,60 @@
+// The driver of one compiler call: runs the compile, parse or elaborate flow
+// over a command line and leaves the elaborated design (or null) behind.
+#ifndef TARN_TN_VERILOGCOMPILER_H
+#define TARN_TN_VERILOGCOMPILER_H
+
+#include <memory>
+
+#include "src/tn_verilogoptions.h"
+#include "util/tn_messagecheckpoint.h"
+#include "verilog/tn_verilogfilelist.h"
+
+class Tn_VerilogDesign;
+
+class Tn_VerilogCompiler {
+public:
+    Tn_VerilogCompiler();
+    ~Tn_VerilogCompiler();
+    Tn_VerilogCompiler(const Tn_VerilogCompiler&) = delete;
+    Tn_VerilogCompiler& operator=(const Tn_VerilogCompiler&) = delete;
+
+    // Each flow returns the number of errors issued during it.
+    int compile(const Tn_StringList& args);
+    int parse(const Tn_StringList& args);
+    int elaborate(const Tn_StringList& args);
+
+    // The result design; the driver's slot becomes null.
+    std::unique_ptr<Tn_VerilogDesign> takeResult();
+    // The files read in this call.
+    const Tn_VerilogFileList& sourceFiles() const { return files_; }
+    const Tn_VerilogOptions& options() const { return options_; }
+
+private:
+    enum Flow { COMPILE, PARSE, ELABORATE };
+
+    int run(Flow flow, const Tn_StringList& args);
+    void open(Flow flow, const Tn_StringList& args);
+    void compileFlow();
+    void parseFlow();
+    void elaborateFlow();
+    bool errorsSoFar() const { return checkpoint_.errorsIssued(); }
+
+    // Front end: reads every source file into the work library; the names of
+    // the units compiled are appended to compiled when given.
+    void parseSources(Tn_StringList* compiled);
+    // The -top names, else the units no other unit instantiates (error when none).
+    Tn_StringList topUnits();
+    // Elaborates tops (built into a design container) and keeps the result.
+    void elaborateTops(const Tn_StringList& tops, bool recursive);
+    // The unelaborated container: one top instance per name, -G overrides applied.
+    std::unique_ptr<Tn_VerilogDesign> buildDesign(const Tn_StringList& tops);
+    // Applies the -G overrides to one top instance (all named or all ordered).
+    void applyOverrides(const Port_String& top);
+
+    Tn_VerilogOptions options_;
+    Tn_VerilogFileList files_;
+    std::unique_ptr<Tn_VerilogDesign> result_;
+    Tn_MessageCheckpoint checkpoint_;
+};
+
+#endif
