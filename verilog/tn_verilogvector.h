@@ -164,6 +164,9 @@ private:
     struct Limb {
         uint32_t a, b;
     };
+    struct UninitTag {};
+    // Words left unset; unsigned, sized, Binary, [width-1:0].
+    Tn_VerilogVector(UninitTag, uint32_t width);
     static uint32_t wordsFor(uint32_t width) { return (width - 1) / 32 + 1; }
     bool isInline() const { return width_ <= 64; }
     Limb* words() { return isInline() ? inline_ : heap_; }
@@ -171,8 +174,11 @@ private:
     void allocate(uint32_t width);
     void release();
     void copyFrom(const Tn_VerilogVector& o);
+    void takeFrom(Tn_VerilogVector& o);
     uint32_t topMask() const { return Tn_VerilogVectorWord::maskOf(width_ - (wordCount() - 1) * 32); }
     void fill(unsigned code);
+    void maskTop();
+    void boundsFromWidth();
 
     friend class Tn_VerilogVectorOps;
 
