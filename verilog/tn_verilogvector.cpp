@@ -1,7 +1,6 @@
 #include "verilog/tn_verilogvector.h"
 
 #include <cmath>
-#include <cstdio>
 #include <cstring>
 #include <new>
 #include <string>
@@ -152,24 +151,31 @@ void divLimbs(const uint32_t* u, uint32_t m, const uint32_t* v, uint32_t nv, uin
     r[nv - 1] = un[nv - 1] >> s;
 }
 
-// Decimal digits of a magnitude (destroyed), most significant first.
+// Decimal digits of a magnitude (destroyed), most significant first: nine
+// digits a division by 10^9, written from the end of one buffer.
 std::string magnitudeText(uint32_t* x, uint32_t n) {
-    std::string chunks;
     n = significant(x, n);
-    std::vector<uint32_t> parts;
+    std::string text(size_t(n) * 10 + 10, '0');
+    size_t end = text.size();
     while (n > 0) {
-        parts.push_back(divSmall(x, n, 1000000000u));
+        uint32_t chunk = divSmall(x, n, 1000000000u);
         n = significant(x, n);
+        for (int k = 0; k < 9; ++k, chunk /= 10) text[--end] = static_cast<char>('0' + chunk % 10);
     }
-    if (parts.empty()) return "0";
-    char buf[16];
-    std::snprintf(buf, sizeof buf, "%u", parts.back());
-    chunks = buf;
-    for (size_t i = parts.size() - 1; i-- > 0;) {
-        std::snprintf(buf, sizeof buf, "%09u", parts[i]);
-        chunks += buf;
-    }
-    return chunks;
+    size_t first = text.find_first_not_of('0');
+    return first == std::string::npos ? std::string("0") : text.substr(first);
+}
+
+// "-" (when negative) and the digits of a 64-bit magnitude.
+Port_String decimalText(uint64_t magnitude, bool negative) {
+    char buf[24];
+    char* p = buf + sizeof buf;
+    do {
+        *--p = static_cast<char>('0' + magnitude % 10);
+        magnitude /= 10;
+    } while (magnitude);
+    if (negative) *--p = '-';
+    return Port_String(p, static_cast<int>(buf + sizeof buf - p));
 }
 
 int digitValue(char c) {
@@ -208,9 +214,23 @@ public:
             if (i + 1 == n) return Limb{w[i].a | (fa & hi), w[i].b | (fb & hi)};
             return Limb{fa, fb};
         }
-        // The low 64 bits (extended), for widths up to 64.
-        uint64_t a64() const { return uint64_t(at(0).a) | (uint64_t(at(1).a) << 32); }
-        uint64_t b64() const { return uint64_t(at(0).b) | (uint64_t(at(1).b) << 32); }
+    };
+
+    // An operand of at most 64 bits as two 64-bit planes, extended as widening
+    // with the given sign fills. The inline words above the width are 0.
+    struct Small {
+        uint64_t a, b;
+        Small(const V& v, bool isSigned)
+            : a(uint64_t(v.inline_[0].a) | (uint64_t(v.inline_[1].a) << 32)),
+              b(uint64_t(v.inline_[0].b) | (uint64_t(v.inline_[1].b) << 32)) {
+            uint32_t top = v.width_ - 1;
+            if (top == 63) return;
+            unsigned m = static_cast<unsigned>(((a >> top) & 1u) | (((b >> top) & 1u) << 1));
+            if (m == kBit0 || (!isSigned && (m == kBit1 || !v.unsized_))) return;
+            uint64_t high = ~mask64(top + 1);
+            if (m & 1u) a |= high;
+            if (m & 2u) b |= high;
+        }
     };
 
     // Fill bit of widening: 0 stays 0, 1 repeats when signed, z and x repeat
@@ -293,12 +313,11 @@ public:
         uint32_t w = widthOf(l, r);
         bool s = signOf(l, r);
         V res = binaryResult(l, r, w, s);
-        Ext x(l, s), y(r, s);
         Limb* out = res.words();
         if (w <= 64) {
-            uint64_t a1 = x.a64(), a2 = y.a64();
-            uint64_t unknown = x.b64() | y.b64();
-            uint64_t sum = subtract ? a1 - a2 : a1 + a2;
+            Small x(l, s), y(r, s);
+            uint64_t unknown = x.b | y.b;
+            uint64_t sum = subtract ? x.a - y.a : x.a + y.a;
             uint64_t a = sum, b = 0;
             if (unknown) {
                 uint64_t known = (unknown & (0 - unknown)) - 1;
@@ -308,12 +327,18 @@ public:
             out[0] = Limb{static_cast<uint32_t>(a), static_cast<uint32_t>(b)};
             if (w > 32) out[1] = Limb{static_cast<uint32_t>(a >> 32), static_cast<uint32_t>(b >> 32)};
         } else {
+            Ext x(l, s), y(r, s);
             unsigned carry = subtract ? kBit1 : kBit0;
             for (uint32_t i = 0, n = res.wordCount(); i < n; ++i) {
                 Limb a = x.at(i), b = y.at(i);
-                Word rw(32, b.a, b.b);
-                if (subtract) rw = rw.bitNot();
-                Word sum = Word::addWithCarry(Word(32, a.a, a.b), rw, carry);
+                if (subtract) b = Limb{~b.a | b.b, b.b};
+                if ((a.b | b.b) == 0 && carry <= kBit1) {
+                    uint64_t t = uint64_t(a.a) + b.a + carry;
+                    out[i] = Limb{static_cast<uint32_t>(t), 0};
+                    carry = static_cast<unsigned>(t >> 32);
+                    continue;
+                }
+                Word sum = Word::addWithCarry(Word(32, a.a, a.b), Word(32, b.a, b.b), carry);
                 out[i] = Limb{sum.aval(), sum.bval()};
             }
         }
@@ -359,11 +384,11 @@ public:
         bool s = signOf(l, r);
         V res = binaryResult(l, r, w, s);
         if (l.hasUnknown() || r.hasUnknown()) return allX(std::move(res));
-        Ext x(l, s), y(r, s);
         if (w <= 64) {
-            store64(res, x.a64() * y.a64(), false);
+            store64(res, Small(l, s).a * Small(r, s).a, false);
             return res;
         }
+        Ext x(l, s), y(r, s);
         uint32_t n = wordsFor(w);
         Limbs a(n), b(n), p(n);
         plane(x, w, a.data());
@@ -390,9 +415,8 @@ public:
         bool s = signOf(l, r);
         V res = binaryResult(l, r, w, s);
         if (l.hasUnknown() || r.hasUnknown() || r.isZero()) return allX(std::move(res));
-        Ext x(l, s), y(r, s);
         if (w <= 64) {
-            uint64_t a = x.a64(), b = y.a64();
+            uint64_t a = Small(l, s).a, b = Small(r, s).a;
             uint64_t q, m;
             if (s) {
                 int64_t sa = static_cast<int64_t>(a), sb = static_cast<int64_t>(b);
@@ -412,6 +436,7 @@ public:
             store64(res, remainder ? m : q, false);
             return res;
         }
+        Ext x(l, s), y(r, s);
         uint32_t n = wordsFor(w);
         Limbs a(n), b(n), q(n), m(n);
         plane(x, w, a.data());
@@ -458,7 +483,7 @@ public:
         while (expTop > 0 && e[expTop - 1].a == 0) --expTop;
         if (w <= 64) {
             uint64_t m = mask64(w);
-            uint64_t result = 1, running = Ext(base, false).a64() & m;
+            uint64_t result = 1, running = Small(base, false).a & m;
             for (uint32_t i = 0; i < expTop; ++i) {
                 uint32_t bits = e[i].a;
                 for (int k = 0; k < 32; ++k) {
@@ -518,6 +543,14 @@ public:
     // 1-bit result of a relational operator: x with any unknown bit.
     template <class Pred>
     static V relation(const V& l, const V& r, Pred pred) {
+        if (l.width_ <= 64 && r.width_ <= 64) {
+            bool s = signOf(l, r);
+            Small x(l, s), y(r, s);
+            if (x.b | y.b) return bitResult(kBitX);
+            int c = s ? (static_cast<int64_t>(x.a) < static_cast<int64_t>(y.a) ? -1 : x.a != y.a)
+                      : (x.a < y.a ? -1 : x.a != y.a);
+            return bitResult(pred(c) ? kBit1 : kBit0);
+        }
         if (l.hasUnknown() || r.hasUnknown()) return bitResult(kBitX);
         return bitResult(pred(compare(l, r)) ? kBit1 : kBit0);
     }
@@ -525,6 +558,14 @@ public:
     // Logic equality code: 0 when a known bit differs, else x with an unknown bit, else 1.
     static unsigned equalCode(const V& l, const V& r) {
         bool s = signOf(l, r);
+        uint32_t w = widthOf(l, r);
+        if (w <= 64) {
+            Small x(l, s), y(r, s);
+            uint64_t m = mask64(w);
+            uint64_t u = (x.b | y.b) & m;
+            if ((x.a ^ y.a) & ~u & m) return kBit0;
+            return u ? kBitX : kBit1;
+        }
         Ext x(l, s), y(r, s);
         uint32_t n = wordsFor(widthOf(l, r));
         uint32_t top = Word::maskOf(topBits(widthOf(l, r)));
@@ -629,40 +670,43 @@ public:
         return res;
     }
 
-    // count bits of src from srcOff into dst at dstOff (both planes).
+    // Up to 32 bits of src from offset (both planes), low-aligned.
+    static Limb readBits(const Limb* src, uint32_t offset, uint32_t count) {
+        uint32_t si = offset / 32, sb = offset % 32;
+        Limb f{src[si].a >> sb, src[si].b >> sb};
+        if (sb && sb + count > 32) {
+            f.a |= src[si + 1].a << (32 - sb);
+            f.b |= src[si + 1].b << (32 - sb);
+        }
+        uint32_t m = Word::maskOf(count);
+        return Limb{f.a & m, f.b & m};
+    }
+
+    // Up to 32 low bits of value into dst at offset.
+    static void writeBits(Limb* dst, uint32_t offset, uint32_t count, Limb value) {
+        uint32_t m = Word::maskOf(count);
+        uint32_t di = offset / 32, db = offset % 32;
+        dst[di].a = (dst[di].a & ~(m << db)) | ((value.a & m) << db);
+        dst[di].b = (dst[di].b & ~(m << db)) | ((value.b & m) << db);
+        if (db && db + count > 32) {
+            uint32_t m2 = m >> (32 - db);
+            dst[di + 1].a = (dst[di + 1].a & ~m2) | ((value.a & m) >> (32 - db));
+            dst[di + 1].b = (dst[di + 1].b & ~m2) | ((value.b & m) >> (32 - db));
+        }
+    }
+
+    // count bits of src from srcOff into dst at dstOff.
     static void copyBits(Limb* dst, uint32_t dstOff, const Limb* src, uint32_t srcOff, uint32_t count) {
         while (count > 0) {
             uint32_t chunk = count < 32 ? count : 32;
-            uint32_t si = srcOff / 32, sb = srcOff % 32;
-            uint32_t srcWords = (srcOff + chunk - 1) / 32 - si + 1;
-            uint32_t a = src[si].a >> sb, b = src[si].b >> sb;
-            if (sb && srcWords > 1) {
-                a |= src[si + 1].a << (32 - sb);
-                b |= src[si + 1].b << (32 - sb);
-            }
-            uint32_t m = Word::maskOf(chunk);
-            a &= m;
-            b &= m;
-            uint32_t di = dstOff / 32, db = dstOff % 32;
-            dst[di].a = (dst[di].a & ~(m << db)) | (a << db);
-            dst[di].b = (dst[di].b & ~(m << db)) | (b << db);
-            if (db && db + chunk > 32) {
-                uint32_t m2 = m >> (32 - db);
-                dst[di + 1].a = (dst[di + 1].a & ~m2) | (a >> (32 - db));
-                dst[di + 1].b = (dst[di + 1].b & ~m2) | (b >> (32 - db));
-            }
+            writeBits(dst, dstOff, chunk, readBits(src, srcOff, chunk));
             count -= chunk;
             srcOff += chunk;
             dstOff += chunk;
         }
     }
 
-    // Up to 32 bits from offset (within the width) as one limb.
-    static Limb field(const V& v, uint32_t offset, uint32_t count) {
-        Limb f{0, 0};
-        copyBits(&f, 0, v.words(), offset, count);
-        return f;
-    }
+    static Limb field(const V& v, uint32_t offset, uint32_t count) { return readBits(v.words(), offset, count); }
 
     // Digits of a group text (octal, hex): x/X, z/Z rules per group.
     static Port_String groupText(const V& v, uint32_t bitsPerDigit) {
@@ -752,7 +796,7 @@ Tn_VerilogVector::Tn_VerilogVector(Tn_Verilog::BaseType base, bool isSigned, uin
             uint32_t ch = static_cast<unsigned char>(digits[length - 1 - i]);
             uint32_t take = width - off < 8 ? width - off : 8;
             Limb one{ch & Word::maskOf(take), 0};
-            Ops::copyBits(w, off, &one, 0, take);
+            Ops::writeBits(w, off, take, one);
         }
         return;
     }
@@ -814,7 +858,7 @@ Tn_VerilogVector::Tn_VerilogVector(Tn_Verilog::BaseType base, bool isSigned, uin
         uint32_t take = width_ - off < bitsPerDigit ? static_cast<uint32_t>(width_ - off) : bitsPerDigit;
         uint32_t m = Word::maskOf(take);
         Limb d{code == kBit0 ? value & m : ones(code & 1u) & m, ones(code & 2u) & m};
-        Ops::copyBits(w, static_cast<uint32_t>(off), &d, 0, take);
+        Ops::writeBits(w, static_cast<uint32_t>(off), take, d);
         off += bitsPerDigit;
     }
     // Fewer digits than bits: an x or z leading digit extends itself.
@@ -1149,8 +1193,8 @@ int32_t Tn_VerilogVector::toInt() const {
 
 int64_t Tn_VerilogVector::toInt64() const {
     if (hasUnknown()) return 0;
-    uint64_t a = Ops::Ext(*this, signed_).a64();
-    if (width_ < 64 && !signed_) a &= mask64(width_);
+    uint64_t a = width_ <= 64 ? Ops::Small(*this, signed_).a
+                              : uint64_t(words()[0].a) | (uint64_t(words()[1].a) << 32);
     return static_cast<int64_t>(a);
 }
 
@@ -1216,12 +1260,10 @@ Port_String Tn_VerilogVector::toDecimalText() const {
         if (anyX) return isAllX() ? "x" : "X";
         if (anyZ) return isAllZ() ? "z" : "Z";
     }
-    char buf[32];
     if (width_ <= 64) {
-        int64_t v = toInt64();
-        if (signed_) std::snprintf(buf, sizeof buf, "%lld", static_cast<long long>(v));
-        else std::snprintf(buf, sizeof buf, "%llu", static_cast<unsigned long long>(v));
-        return buf;
+        uint64_t v = static_cast<uint64_t>(toInt64());
+        bool negative = signed_ && (v >> 63);
+        return decimalText(negative ? 0 - v : v, negative);
     }
     uint32_t n = wordCount();
     Limbs mag(n);
@@ -1229,11 +1271,7 @@ Port_String Tn_VerilogVector::toDecimalText() const {
     bool negative = isNegative();
     if (negative) Ops::negate(mag.data(), width_);
     uint32_t top = significant(mag.data(), n);
-    if (top <= 2) {
-        uint64_t v = uint64_t(mag[0]) | (top > 1 ? uint64_t(mag[1]) << 32 : 0);
-        std::snprintf(buf, sizeof buf, "%s%llu", negative ? "-" : "", static_cast<unsigned long long>(v));
-        return buf;
-    }
+    if (top <= 2) return decimalText(uint64_t(mag[0]) | (top > 1 ? uint64_t(mag[1]) << 32 : 0), negative);
     std::string text = magnitudeText(mag.data(), top);
     return Port_String(negative ? "-" + text : text);
 }
