@@ -34,6 +34,11 @@ Vec operand(uint32_t width, uint32_t seed, uint32_t significant) {
     return v;
 }
 
+void reportAllocations(benchmark::State& state, uint64_t before) {
+    state.counters["allocs"] =
+        benchmark::Counter(static_cast<double>(g_allocations - before), benchmark::Counter::kAvgIterations);
+}
+
 // Times op over a pair of operands and reports allocations per operation.
 template <class Op>
 void run(benchmark::State& state, Op op, uint32_t rightSignificant) {
@@ -41,8 +46,7 @@ void run(benchmark::State& state, Op op, uint32_t rightSignificant) {
     Vec l = operand(width, 1, width), r = operand(width, 2, rightSignificant ? rightSignificant : width);
     uint64_t before = g_allocations;
     for (auto _ : state) benchmark::DoNotOptimize(op(l, r));
-    state.counters["allocs"] =
-        benchmark::Counter(static_cast<double>(g_allocations - before), benchmark::Counter::kAvgIterations);
+    reportAllocations(state, before);
 }
 
 void Add(benchmark::State& s) { run(s, [](const Vec& a, const Vec& b) { return a.add(b); }, 0); }
@@ -55,25 +59,22 @@ void LessThan(benchmark::State& s) { run(s, [](const Vec& a, const Vec& b) { ret
 void Equal(benchmark::State& s) { run(s, [](const Vec& a, const Vec& b) { return a.equal(b); }, 0); }
 void DecimalText(benchmark::State& s) { run(s, [](const Vec& a, const Vec&) { return a.toDecimalText(); }, 0); }
 
-// Value level: the operator on two vector values, fitted to a self-determined context.
-void ValueAdd(benchmark::State& state) {
-    uint32_t width = static_cast<uint32_t>(state.range(0));
-    Tn_VerilogValuePtr l = Tn_VerilogValue::createVector(operand(width, 1, width));
-    Tn_VerilogValuePtr r = Tn_VerilogValue::createVector(operand(width, 2, width));
+// Value level: addition of two values fitted to a self-determined context.
+void runValueAdd(benchmark::State& state, const Tn_VerilogValuePtr& l, const Tn_VerilogValuePtr& r) {
     Tn_VerilogEvalContext ctx;
     uint64_t before = g_allocations;
     for (auto _ : state) benchmark::DoNotOptimize(Tn_VerilogValue::addition(l, r, ctx));
-    state.counters["allocs"] =
-        benchmark::Counter(static_cast<double>(g_allocations - before), benchmark::Counter::kAvgIterations);
+    reportAllocations(state, before);
+}
+
+void ValueAdd(benchmark::State& state) {
+    uint32_t width = static_cast<uint32_t>(state.range(0));
+    runValueAdd(state, Tn_VerilogValue::createVector(operand(width, 1, width)),
+                Tn_VerilogValue::createVector(operand(width, 2, width)));
 }
 
 void ValueIntegerAdd(benchmark::State& state) {
-    Tn_VerilogValuePtr l = Tn_VerilogValue::createInteger(12345), r = Tn_VerilogValue::createInteger(-678);
-    Tn_VerilogEvalContext ctx;
-    uint64_t before = g_allocations;
-    for (auto _ : state) benchmark::DoNotOptimize(Tn_VerilogValue::addition(l, r, ctx));
-    state.counters["allocs"] =
-        benchmark::Counter(static_cast<double>(g_allocations - before), benchmark::Counter::kAvgIterations);
+    runValueAdd(state, Tn_VerilogValue::createInteger(12345), Tn_VerilogValue::createInteger(-678));
 }
 
 // Reference point: the bare machine addition the 64-bit path competes with.

@@ -225,22 +225,22 @@ public:
               b(uint64_t(v.inline_[0].b) | (uint64_t(v.inline_[1].b) << 32)) {
             uint32_t top = v.width_ - 1;
             if (top == 63) return;
-            unsigned m = static_cast<unsigned>(((a >> top) & 1u) | (((b >> top) & 1u) << 1));
-            if (m == kBit0 || (!isSigned && (m == kBit1 || !v.unsized_))) return;
+            unsigned fill = fillFor(static_cast<unsigned>(((a >> top) & 1u) | (((b >> top) & 1u) << 1)), isSigned,
+                                    v.unsized_);
             uint64_t high = ~mask64(top + 1);
-            if (m & 1u) a |= high;
-            if (m & 2u) b |= high;
+            if (fill & 1u) a |= high;
+            if (fill & 2u) b |= high;
         }
     };
 
     // Fill bit of widening: 0 stays 0, 1 repeats when signed, z and x repeat
     // when signed or unsized.
-    static unsigned fillCode(const V& v, bool isSigned) {
-        unsigned m = v.bit(v.width_ - 1);
-        if (m == kBit0) return kBit0;
-        if (m == kBit1) return isSigned ? kBit1 : kBit0;
-        return (isSigned || v.unsized_) ? m : kBit0;
+    static unsigned fillFor(unsigned top, bool isSigned, bool unsized) {
+        if (top == kBit0) return kBit0;
+        if (top == kBit1) return isSigned ? kBit1 : kBit0;
+        return (isSigned || unsized) ? top : kBit0;
     }
+    static unsigned fillCode(const V& v, bool isSigned) { return fillFor(v.bit(v.width_ - 1), isSigned, v.unsized_); }
 
     static Tn_Verilog::BaseType commonBase(const V& l, const V& r) {
         return (l.base_ == r.base_ && l.base_ != Tn_Verilog::String) ? l.base() : Tn_Verilog::Binary;
@@ -371,6 +371,15 @@ public:
     }
 
     static bool topBitSet(const uint32_t* x, uint32_t w) { return (x[(w - 1) / 32] >> ((w - 1) % 32)) & 1u; }
+
+    // The aval plane of a known vector into mag (wordCount limbs), negated when
+    // the vector is signed and negative; true in that case.
+    static bool magnitude(const V& v, Limbs& mag) {
+        for (uint32_t i = 0, n = v.wordCount(); i < n; ++i) mag[i] = v.words()[i].a;
+        bool negative = v.isNegative();
+        if (negative) negate(mag.data(), v.width_);
+        return negative;
+    }
 
     // Keeps the low w bits of a two's complement negation.
     static void negate(uint32_t* x, uint32_t w) {
@@ -596,30 +605,17 @@ public:
         return true;
     }
 
-    static unsigned reduceOrCode(const V& v) {
-        unsigned code = kBit0;
-        for (uint32_t i = 0, n = v.wordCount(); i < n; ++i) {
-            code = Word::orCode(code, v.word(i).reduceOr());
-            if (code == kBit1) break;
-        }
+    // Word reductions combined with the same table, stopping at the deciding code.
+    static unsigned reduce(const V& v, unsigned start, unsigned decided, unsigned (Word::*wordReduce)() const,
+                           unsigned (*combine)(unsigned, unsigned)) {
+        unsigned code = start;
+        for (uint32_t i = 0, n = v.wordCount(); i < n && code != decided; ++i)
+            code = combine(code, (v.word(i).*wordReduce)());
         return code;
     }
-    static unsigned reduceAndCode(const V& v) {
-        unsigned code = kBit1;
-        for (uint32_t i = 0, n = v.wordCount(); i < n; ++i) {
-            code = Word::andCode(code, v.word(i).reduceAnd());
-            if (code == kBit0) break;
-        }
-        return code;
-    }
-    static unsigned reduceXorCode(const V& v) {
-        unsigned code = kBit0;
-        for (uint32_t i = 0, n = v.wordCount(); i < n; ++i) {
-            code = Word::xorCode(code, v.word(i).reduceXor());
-            if (code == kBitX) break;
-        }
-        return code;
-    }
+    static unsigned reduceOrCode(const V& v) { return reduce(v, kBit0, kBit1, &Word::reduceOr, Word::orCode); }
+    static unsigned reduceAndCode(const V& v) { return reduce(v, kBit1, kBit0, &Word::reduceAnd, Word::andCode); }
+    static unsigned reduceXorCode(const V& v) { return reduce(v, kBit0, kBitX, &Word::reduceXor, Word::xorCode); }
 
     // Bits move up by count; vacated bits are 0.
     static V shiftUp(const V& v, uint32_t count) {
@@ -930,6 +926,7 @@ void Tn_VerilogVector::takeFrom(Tn_VerilogVector& o) {
     o.width_ = 1;
     o.msb_ = o.lsb_ = 0;
     o.inline_[0] = Limb{1, 1};
+    o.inline_[1] = Limb{0, 0};
 }
 
 void Tn_VerilogVector::copyFrom(const Tn_VerilogVector& o) {
@@ -1214,9 +1211,7 @@ double Tn_VerilogVector::toReal() const {
     }
     uint32_t n = wordCount();
     Limbs mag(n);
-    for (uint32_t i = 0; i < n; ++i) mag[i] = words()[i].a;
-    bool negative = isNegative();
-    if (negative) Ops::negate(mag.data(), width_);
+    bool negative = Ops::magnitude(*this, mag);
     uint32_t top = significant(mag.data(), n);
     if (top == 0) return 0.0;
     // The 64 bits below the top set bit, with the rest folded into a sticky
@@ -1267,9 +1262,7 @@ Port_String Tn_VerilogVector::toDecimalText() const {
     }
     uint32_t n = wordCount();
     Limbs mag(n);
-    for (uint32_t i = 0; i < n; ++i) mag[i] = words()[i].a;
-    bool negative = isNegative();
-    if (negative) Ops::negate(mag.data(), width_);
+    bool negative = Ops::magnitude(*this, mag);
     uint32_t top = significant(mag.data(), n);
     if (top <= 2) return decimalText(uint64_t(mag[0]) | (top > 1 ? uint64_t(mag[1]) << 32 : 0), negative);
     std::string text = magnitudeText(mag.data(), top);

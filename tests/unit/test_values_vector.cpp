@@ -155,6 +155,7 @@ TEST(VectorValueSemantics, CopiesAreIndependentAndCompareByEveryField) {
     Vec moved = std::move(copy);
     EXPECT_EQ(moved.bit(100), 1u);
     EXPECT_EQ(copy.width(), 1u);  // moved-from is a valid one-bit x
+    EXPECT_EQ(bin(copy.bitOr(vec("2'b00"))), "0x");
     copy = moved;
     EXPECT_EQ(copy, moved);
     copy = copy;
