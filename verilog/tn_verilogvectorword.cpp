@@ -44,7 +44,7 @@ Tn_VerilogVectorWord Tn_VerilogVectorWord::addWithCarry(const Tn_VerilogVectorWo
     uint64_t sum = uint64_t(x.aval_) + y.aval_ + carry;
     uint32_t unknown = x.bval_ | y.bval_;
     if (unknown == 0) {
-        carry = static_cast<unsigned>((sum >> size) & 1u);
+        carry = static_cast<unsigned>(sum >> 32);
         return Tn_VerilogVectorWord(size, static_cast<uint32_t>(sum), 0);
     }
     // Bits from the lowest unknown one upward are x; the carry out too.
