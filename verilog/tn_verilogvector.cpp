@@ -41,7 +41,8 @@ public:
     uint32_t operator[](uint32_t i) const { return p_[i]; }
 
 private:
-    static const uint32_t kSmall = 8;
+    // Up to 1152 bits (with a spare limb for division) without the heap.
+    static const uint32_t kSmall = 37;
     uint32_t n_;
     uint32_t small_[kSmall];
     std::vector<uint32_t> big_;
@@ -163,7 +164,9 @@ std::string magnitudeText(uint32_t* x, uint32_t n) {
         for (int k = 0; k < 9; ++k, chunk /= 10) text[--end] = static_cast<char>('0' + chunk % 10);
     }
     size_t first = text.find_first_not_of('0');
-    return first == std::string::npos ? std::string("0") : text.substr(first);
+    if (first == std::string::npos) return "0";
+    text.erase(0, first);
+    return text;
 }
 
 // "-" (when negative) and the digits of a 64-bit magnitude.
@@ -1266,7 +1269,8 @@ Port_String Tn_VerilogVector::toDecimalText() const {
     uint32_t top = significant(mag.data(), n);
     if (top <= 2) return decimalText(uint64_t(mag[0]) | (top > 1 ? uint64_t(mag[1]) << 32 : 0), negative);
     std::string text = magnitudeText(mag.data(), top);
-    return Port_String(negative ? "-" + text : text);
+    if (negative) text.insert(text.begin(), '-');
+    return Port_String(std::move(text));
 }
 
 Port_String Tn_VerilogVector::toCharText() const {
