@@ -60,7 +60,9 @@ Tn_VerilogValuePtr fitInteger(int32_t value, const Ctx& ctx) {
 }
 
 Tn_VerilogValuePtr oneBit(bool set, const Ctx& ctx) {
-    return fitVector(Vec(Tn_Verilog::Binary, false, 1, set ? "1" : "0", 1), ctx);
+    Vec bit(false, 1u);
+    bit.setBit(0, set ? 1u : 0u);
+    return fitVector(std::move(bit), ctx);
 }
 
 // How one binary operator behaves on each kind of operand.

@@ -18,9 +18,8 @@ const unsigned kBitX = Word::BitX;
 
 inline uint32_t ones(bool set) { return set ? 0xFFFFFFFFu : 0u; }
 inline uint64_t mask64(uint32_t width) { return width >= 64 ? ~uint64_t(0) : (uint64_t(1) << width) - 1; }
-inline uint32_t wordsFor(uint32_t width) { return (width - 1) / 32 + 1; }
 // Bits in the top word of a width (1 to 32).
-inline uint32_t topBits(uint32_t width) { return width - (wordsFor(width) - 1) * 32; }
+inline uint32_t topBits(uint32_t width) { return (width - 1) % 32 + 1; }
 
 // Limbs of one plane for arithmetic on known values; small ones stay on the stack.
 class Limbs {
@@ -351,7 +350,7 @@ public:
 
     // The aval plane of an operand extended and cut to w bits (known values).
     static void plane(const Ext& e, uint32_t w, uint32_t* out) {
-        uint32_t n = wordsFor(w);
+        uint32_t n = V::wordsFor(w);
         for (uint32_t i = 0; i < n; ++i) out[i] = e.at(i).a;
         out[n - 1] &= Word::maskOf(topBits(w));
     }
@@ -386,7 +385,7 @@ public:
 
     // Keeps the low w bits of a two's complement negation.
     static void negate(uint32_t* x, uint32_t w) {
-        uint32_t n = wordsFor(w);
+        uint32_t n = V::wordsFor(w);
         negateLimbs(x, n);
         x[n - 1] &= Word::maskOf(topBits(w));
     }
@@ -401,7 +400,7 @@ public:
             return res;
         }
         Ext x(l, s), y(r, s);
-        uint32_t n = wordsFor(w);
+        uint32_t n = V::wordsFor(w);
         Limbs a(n), b(n), p(n);
         plane(x, w, a.data());
         plane(y, w, b.data());
@@ -449,7 +448,7 @@ public:
             return res;
         }
         Ext x(l, s), y(r, s);
-        uint32_t n = wordsFor(w);
+        uint32_t n = V::wordsFor(w);
         Limbs a(n), b(n), q(n), m(n);
         plane(x, w, a.data());
         plane(y, w, b.data());
@@ -507,7 +506,7 @@ public:
             store64(res, result & m, false);
             return res;
         }
-        uint32_t n = wordsFor(w);
+        uint32_t n = V::wordsFor(w);
         Limbs result(n), running(n), tmp(n);
         result[0] = 1;
         plane(Ext(base, false), w, running.data());
@@ -542,7 +541,7 @@ public:
     static int compare(const V& l, const V& r) {
         bool s = signOf(l, r);
         Ext x(l, s), y(r, s);
-        uint32_t n = wordsFor(widthOf(l, r));
+        uint32_t n = V::wordsFor(widthOf(l, r));
         for (uint32_t i = n; i-- > 0;) {
             uint32_t a = x.at(i).a, b = y.at(i).a;
             if (a == b) continue;
@@ -579,7 +578,7 @@ public:
             return u ? kBitX : kBit1;
         }
         Ext x(l, s), y(r, s);
-        uint32_t n = wordsFor(widthOf(l, r));
+        uint32_t n = V::wordsFor(widthOf(l, r));
         uint32_t top = Word::maskOf(topBits(widthOf(l, r)));
         bool unknown = false;
         for (uint32_t i = 0; i < n; ++i) {
@@ -598,7 +597,7 @@ public:
         bool s = signOf(l, r);
         Ext x(l, s), y(r, s);
         uint32_t w = widthOf(l, r);
-        uint32_t n = wordsFor(w);
+        uint32_t n = V::wordsFor(w);
         uint32_t top = Word::maskOf(topBits(w));
         for (uint32_t i = 0; i < n; ++i) {
             Limb a = x.at(i), b = y.at(i);

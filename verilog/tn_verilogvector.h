@@ -165,7 +165,7 @@ private:
         uint32_t a, b;
     };
     struct UninitTag {};
-    // Words left unset; unsigned, sized, Binary, [width-1:0].
+    // Words to be written by the caller (inline ones start 0); unsigned, sized, Binary, [width-1:0].
     Tn_VerilogVector(UninitTag, uint32_t width);
     static uint32_t wordsFor(uint32_t width) { return (width - 1) / 32 + 1; }
     bool isInline() const { return width_ <= 64; }
@@ -175,7 +175,7 @@ private:
     void release();
     void copyFrom(const Tn_VerilogVector& o);
     void takeFrom(Tn_VerilogVector& o);
-    uint32_t topMask() const { return Tn_VerilogVectorWord::maskOf(width_ - (wordCount() - 1) * 32); }
+    uint32_t topMask() const { return Tn_VerilogVectorWord::maskOf((width_ - 1) % 32 + 1); }
     void fill(unsigned code);
     void maskTop();
     void boundsFromWidth();
