@@ -3,6 +3,7 @@
 #include "util/tn_exception.h"
 #include "util/tn_message.h"
 #include "verilog/tn_verilogdesign.h"
+#include "verilog/tn_verilognodes.h"
 
 Tn_VerilogCompiler::Tn_VerilogCompiler() {}
 
@@ -74,15 +75,23 @@ void Tn_VerilogCompiler::elaborateTops(const Tn_StringList& tops, bool /*recursi
 }
 
 std::unique_ptr<Tn_VerilogDesign> Tn_VerilogCompiler::buildDesign(const Tn_StringList& tops) {
-    std::unique_ptr<Tn_VerilogDesign> design(new Tn_VerilogDesign("DESIGN", "", options_));
+    std::unique_ptr<Tn_VerilogDesign> design(new Tn_VerilogDesign(options_.workLibrary(), "DESIGN", options_));
+    Tn_VerilogNodeFactory& f = design->factory();
+    Tn_VerilogRoot* root = f.createRoot();
+    design->setRoot(root);
     for (const Port_String& top : tops) {
-        applyOverrides(top);
+        Tn_VerilogModuleInstance* inst = f.createModuleInstance();
+        inst->Name = top;
+        inst->DefName = top;
+        inst->Parent = root;
+        root->ModuleInstance.push_back(inst);
+        applyOverrides(*design, *inst);
         if (errorsSoFar()) break;
     }
     return design;
 }
 
-void Tn_VerilogCompiler::applyOverrides(const Port_String& /*top*/) {
+void Tn_VerilogCompiler::applyOverrides(Tn_VerilogDesign& design, Tn_VerilogModuleInstance& inst) {
     const auto& overrides = options_.paramOverrides();
     if (overrides.empty()) return;
     const bool named = !overrides.front().first.IsEmpty();
@@ -91,6 +100,11 @@ void Tn_VerilogCompiler::applyOverrides(const Port_String& /*top*/) {
             TN_MSG().issueError("-G parameter assignments must either be all named or all ordered\n");
             return;
         }
-        // The value is parsed as an expression and attached to the top instance.
+        // The parser turns the value text into the assignment's expression.
+        Tn_VerilogParamAssignment* a = design.factory().createParamAssignment();
+        a->Name = o.first;
+        a->NamedParamAssignmentFlag = named;
+        a->CmdLineParamAssignmentFlag = true;
+        inst.ParamAssignment.push_back(a);
     }
 }

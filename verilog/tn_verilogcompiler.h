@@ -10,6 +10,7 @@
 #include "verilog/tn_verilogfilelist.h"
 
 class Tn_VerilogDesign;
+class Tn_VerilogModuleInstance;
 
 class Tn_VerilogCompiler {
 public:
@@ -49,7 +50,7 @@ private:
     // The unelaborated container: one top instance per name, -G overrides applied.
     std::unique_ptr<Tn_VerilogDesign> buildDesign(const Tn_StringList& tops);
     // Applies the -G overrides to one top instance (all named or all ordered).
-    void applyOverrides(const Port_String& top);
+    void applyOverrides(Tn_VerilogDesign& design, Tn_VerilogModuleInstance& inst);
 
     Tn_VerilogOptions options_;
     Tn_VerilogFileList files_;
