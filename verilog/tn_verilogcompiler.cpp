@@ -1,8 +1,15 @@
 #include "verilog/tn_verilogcompiler.h"
 
+#include <algorithm>
+#include <unordered_set>
+
+#include "library/tn_transientlibrary.h"
+
 #include "util/tn_exception.h"
 #include "util/tn_message.h"
 #include "verilog/tn_verilogdesign.h"
+#include "verilog/tn_verilogdesignunit.h"
+#include "verilog/tn_verilognodes.h"
 
 Tn_VerilogCompiler::Tn_VerilogCompiler() {}
 
@@ -37,33 +44,75 @@ void Tn_VerilogCompiler::open(Flow /*flow*/, const Tn_StringList& args) {
 }
 
 void Tn_VerilogCompiler::compileFlow() {
-    if (!errorsSoFar()) parseSources(nullptr);
+    Tn_TransientLibraryManager libraries;
+    Tn_Library* work = libraries.open(options_.workLibrary());
+    if (!errorsSoFar()) parseSources(*work, nullptr);
     Tn_StringList tops;
-    if (!errorsSoFar()) tops = topUnits();
+    if (!errorsSoFar()) tops = topUnits(*work);
     if (!errorsSoFar()) elaborateTops(tops, options_.recursive());
 }
 
 void Tn_VerilogCompiler::parseFlow() {
+    // The binary library manager takes the work library's place here.
+    Tn_TransientLibraryManager libraries;
+    Tn_Library* work = libraries.open(options_.workLibrary());
     Tn_StringList compiled;
-    if (!errorsSoFar()) parseSources(&compiled);
+    if (!errorsSoFar()) parseSources(*work, &compiled);
     // Each unit compiled here is checked by itself.
     if (!errorsSoFar()) elaborateTops(compiled, false);
 }
 
 void Tn_VerilogCompiler::elaborateFlow() {
+    Tn_TransientLibraryManager libraries;
+    Tn_Library* work = libraries.open(options_.workLibrary());
     Tn_StringList tops;
-    if (!errorsSoFar()) tops = topUnits();
+    if (!errorsSoFar()) tops = topUnits(*work);
     if (!errorsSoFar()) elaborateTops(tops, options_.recursive());
 }
 
-void Tn_VerilogCompiler::parseSources(Tn_StringList* /*compiled*/) {
+void Tn_VerilogCompiler::parseSources(Tn_Library& /*work*/, Tn_StringList* /*compiled*/) {
     // The scanner and parser fill the work library here.
 }
 
-Tn_StringList Tn_VerilogCompiler::topUnits() {
+Tn_StringList Tn_VerilogCompiler::topUnits(Tn_Library& work) {
     Tn_StringList tops = options_.topUnits();
-    // With no -top, the units of the work library that nothing instantiates.
+    if (tops.empty()) tops = findTopUnits(work, options_.recursive());
     if (tops.empty()) TN_MSG().issueError("No top level design units found for elaboration\n");
+    return tops;
+}
+
+namespace {
+
+// Adds the definition names instantiated in region, looking into generate
+// regions and generate arrays but not into generate statements.
+void collectInstantiated(Tn_VerilogConcurrentRegion* region, std::unordered_set<Port_String>& names) {
+    if (!region) return;
+    for (Tn_VerilogModuleInstance* inst : region->ModuleInstance) names.insert(inst->DefName.str());
+    for (Tn_VerilogModuleArray* array : region->ModuleArray)
+        for (Tn_VerilogModuleInstance* inst : array->ModuleInstance) names.insert(inst->DefName.str());
+    for (Tn_VerilogGenerate* g : region->Generate) collectInstantiated(g, names);
+    for (Tn_VerilogGenerateArray* array : region->GenerateArray)
+        for (auto& element : array->Generate.raw()) collectInstantiated(static_cast<Tn_VerilogGenerate*>(element.second), names);
+}
+
+}  // namespace
+
+Tn_StringList Tn_VerilogCompiler::findTopUnits(Tn_Library& work, bool recursive) {
+    std::vector<Port_String> units;
+    std::unordered_set<Port_String> instantiated;
+    for (Tn_LibraryUnit* u : work.units()) {
+        if (u->unitKind() != Tn_LibraryUnit::VERILOG_DESIGN_UNIT && u->unitKind() != Tn_LibraryUnit::VERILOG_DESIGN_UNIT_2)
+            continue;
+        units.push_back(u->name());
+        if (recursive)
+            collectInstantiated(Tn_VerilogNode::cast<Tn_VerilogModule>(static_cast<Tn_VerilogDesignUnit*>(u)->node()),
+                                instantiated);
+    }
+    Tn_StringList tops;
+    for (const Port_String& name : units)
+        if (!instantiated.count(name)) tops.push_back(name);
+    // Byte order: std::string compares bytes as unsigned char.
+    std::sort(tops.begin(), tops.end());
     return tops;
 }
 
@@ -74,15 +123,23 @@ void Tn_VerilogCompiler::elaborateTops(const Tn_StringList& tops, bool /*recursi
 }
 
 std::unique_ptr<Tn_VerilogDesign> Tn_VerilogCompiler::buildDesign(const Tn_StringList& tops) {
-    std::unique_ptr<Tn_VerilogDesign> design(new Tn_VerilogDesign("DESIGN", "", options_));
+    std::unique_ptr<Tn_VerilogDesign> design(new Tn_VerilogDesign(options_.workLibrary(), "DESIGN", options_));
+    Tn_VerilogNodeFactory& f = design->factory();
+    Tn_VerilogRoot* root = f.createRoot();
+    design->setRoot(root);
     for (const Port_String& top : tops) {
-        applyOverrides(top);
+        Tn_VerilogModuleInstance* inst = f.createModuleInstance();
+        inst->Name = top;
+        inst->DefName = top;
+        inst->Parent = root;
+        root->ModuleInstance.push_back(inst);
+        applyOverrides(*design, *inst);
         if (errorsSoFar()) break;
     }
     return design;
 }
 
-void Tn_VerilogCompiler::applyOverrides(const Port_String& /*top*/) {
+void Tn_VerilogCompiler::applyOverrides(Tn_VerilogDesign& design, Tn_VerilogModuleInstance& inst) {
     const auto& overrides = options_.paramOverrides();
     if (overrides.empty()) return;
     const bool named = !overrides.front().first.IsEmpty();
@@ -91,6 +148,11 @@ void Tn_VerilogCompiler::applyOverrides(const Port_String& /*top*/) {
             TN_MSG().issueError("-G parameter assignments must either be all named or all ordered\n");
             return;
         }
-        // The value is parsed as an expression and attached to the top instance.
+        // The parser turns the value text into the assignment's expression.
+        Tn_VerilogParamAssignment* a = design.factory().createParamAssignment();
+        a->Name = o.first;
+        a->NamedParamAssignmentFlag = named;
+        a->CmdLineParamAssignmentFlag = true;
+        inst.ParamAssignment.push_back(a);
     }
 }

@@ -9,7 +9,9 @@
 #include "util/tn_messagecheckpoint.h"
 #include "verilog/tn_verilogfilelist.h"
 
+class Tn_Library;
 class Tn_VerilogDesign;
+class Tn_VerilogModuleInstance;
 
 class Tn_VerilogCompiler {
 public:
@@ -22,6 +24,14 @@ public:
     int compile(const Tn_StringList& args);
     int parse(const Tn_StringList& args);
     int elaborate(const Tn_StringList& args);
+
+    // The Verilog units of work that no unit of work instantiates (every one
+    // when recursive is false), in ascending byte order of their names.
+    static Tn_StringList findTopUnits(Tn_Library& work, bool recursive);
+
+    // The unelaborated container for the options of the last flow: one top
+    // instance per name, -G overrides applied to each.
+    std::unique_ptr<Tn_VerilogDesign> buildDesign(const Tn_StringList& tops);
 
     // The result design; the driver's slot becomes null.
     std::unique_ptr<Tn_VerilogDesign> takeResult();
@@ -41,15 +51,13 @@ private:
 
     // Front end: reads every source file into the work library; the names of
     // the units compiled are appended to compiled when given.
-    void parseSources(Tn_StringList* compiled);
+    void parseSources(Tn_Library& work, Tn_StringList* compiled);
     // The -top names, else the units no other unit instantiates (error when none).
-    Tn_StringList topUnits();
+    Tn_StringList topUnits(Tn_Library& work);
     // Elaborates tops (built into a design container) and keeps the result.
     void elaborateTops(const Tn_StringList& tops, bool recursive);
-    // The unelaborated container: one top instance per name, -G overrides applied.
-    std::unique_ptr<Tn_VerilogDesign> buildDesign(const Tn_StringList& tops);
     // Applies the -G overrides to one top instance (all named or all ordered).
-    void applyOverrides(const Port_String& top);
+    void applyOverrides(Tn_VerilogDesign& design, Tn_VerilogModuleInstance& inst);
 
     Tn_VerilogOptions options_;
     Tn_VerilogFileList files_;

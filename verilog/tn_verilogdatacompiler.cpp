@@ -3,6 +3,7 @@
 #include "util/tn_exception.h"
 #include "util/tn_messagecheckpoint.h"
 #include "verilog/tn_verilogdesign.h"
+#include "verilog/tn_verilognodes.h"
 
 Tn_VerilogDataCompiler::Tn_VerilogDataCompiler() {}
 
@@ -18,7 +19,8 @@ int Tn_VerilogDataCompiler::compile(const Tn_StringList& args) {
         options_.setStrictPreprocessing(false);
         files_.clear();
         if (!checkpoint.errorsIssued()) {
-            result_.reset(new Tn_VerilogDesign("DESIGN", "", options_));
+            result_.reset(new Tn_VerilogDesign(options_.workLibrary(), "DESIGN", options_));
+            result_->setRoot(result_->factory().createRoot());
             // The data parser reads the source files into result_ here.
         }
     } catch (const Tn_Exception& e) {

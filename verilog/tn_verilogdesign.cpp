@@ -1,6 +1,14 @@
 #include "verilog/tn_verilogdesign.h"
 
-Tn_VerilogDesign::Tn_VerilogDesign(const Port_String& name, const Port_String& secondaryKey, const Tn_VerilogOptions& options)
-    : name_(name), secondaryKey_(secondaryKey), options_(options) {}
+#include "util/tn_ostream.h"
+#include "verilog/tn_verilognodes.h"
 
-Tn_VerilogDesign::~Tn_VerilogDesign() {}
+void Tn_VerilogDesign::print(Tn_OStream& out) const {
+    const char* const dots = ".......................................";
+    out.write(dots);
+    out.write("\n\n");
+    if (root()) root()->dump(out, "Root", 0);
+    out.write("\n");
+    out.write(dots);
+    out.write("\n");
+}

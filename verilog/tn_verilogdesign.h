@@ -1,26 +1,21 @@
-// An elaborated (or unelaborated) design: the container every flow hands to
-// the design-access root. It keeps its own copy of the run's options.
+// A design: the container the driver builds (one instance per top-level
+// unit) and the elaborated hierarchy that elaboration makes from it.
 #ifndef TARN_TN_VERILOGDESIGN_H
 #define TARN_TN_VERILOGDESIGN_H
 
-#include "src/tn_verilogoptions.h"
-#include "tarn/port_stringbase.h"
+#include "verilog/tn_veriloglibraryunit.h"
 
-class Tn_VerilogDesign {
+class Tn_VerilogDesign : public Tn_VerilogLibraryUnit {
 public:
-    Tn_VerilogDesign(const Port_String& name, const Port_String& secondaryKey, const Tn_VerilogOptions& options);
-    virtual ~Tn_VerilogDesign();
-    Tn_VerilogDesign(const Tn_VerilogDesign&) = delete;
-    Tn_VerilogDesign& operator=(const Tn_VerilogDesign&) = delete;
+    Tn_VerilogDesign(const Port_String& libraryName, const Port_String& name, const Tn_VerilogOptions& options)
+        : Tn_VerilogLibraryUnit(libraryName, name, options) {}
 
-    const Port_String& name() const { return name_; }
-    const Port_String& secondaryKey() const { return secondaryKey_; }
-    const Tn_VerilogOptions& options() const { return options_; }
+    int32_t unitKind() const override { return VERILOG_DESIGN; }
+    // A dotted line, the root under "Root", the dotted line again.
+    void print(Tn_OStream& out) const override;
+    void accept(Tn_LibraryUnitVisitor& v) override { v.visit(this); }
 
 private:
-    Port_String name_;
-    Port_String secondaryKey_;
-    Tn_VerilogOptions options_;
 };
 
 #endif

@@ -8,6 +8,7 @@
 #include "tests/support/testfiles.h"
 #include "verilog/tn_verilogcompiler.h"
 #include "verilog/tn_verilogdesign.h"
+#include "verilog/tn_verilognodes.h"
 
 namespace {
 
@@ -186,6 +187,35 @@ TEST(Flows, MixedOverridesAreReportedOnceAndStopFurtherTops) {
     sink.clear();
     EXPECT_EQ(driver.compile({"tarn", "-top", "a", "-G1", "-G2"}), 0);
     EXPECT_TRUE(sink.messages.empty());
+}
+
+TEST(Flows, BuildDesignMakesOneTopInstanceEachWithEveryOverride) {
+    CaptureSink sink;
+    Tn_VerilogCompiler driver;
+    driver.compile({"tarn", "-top", "a", "-top", "b", "-Gwidth=8", "-Gdepth=2"});
+    std::unique_ptr<Tn_VerilogDesign> d = driver.buildDesign({"a", "b"});
+    EXPECT_EQ(d->name().str(), "DESIGN");
+    EXPECT_EQ(d->libraryName().str(), "work");
+    ASSERT_NE(d->root(), nullptr);
+    ASSERT_EQ(d->root()->ModuleInstance.size(), 2u);
+    for (size_t i = 0; i < 2; ++i) {
+        Tn_VerilogModuleInstance* inst = d->root()->ModuleInstance[i];
+        EXPECT_EQ(inst->Name.str().str(), i ? "b" : "a");
+        EXPECT_EQ(inst->DefName, inst->Name);
+        EXPECT_EQ(inst->Parent.get(), d->root());
+        ASSERT_EQ(inst->ParamAssignment.size(), 2u);
+        EXPECT_EQ(inst->ParamAssignment[0]->Name.str().str(), "width");
+        EXPECT_EQ(inst->ParamAssignment[1]->Name.str().str(), "depth");
+        EXPECT_TRUE(inst->ParamAssignment[0]->NamedParamAssignmentFlag);
+        EXPECT_TRUE(inst->ParamAssignment[0]->CmdLineParamAssignmentFlag);
+    }
+    // Mixed overrides: the first top keeps what came before the mismatch; no further tops.
+    driver.compile({"tarn", "-top", "a", "-Gwidth=8", "-G4", "-Gx=1"});
+    sink.clear();
+    d = driver.buildDesign({"a", "b"});
+    EXPECT_EQ(sink.errors(), Strings{"-G parameter assignments must either be all named or all ordered\n"});
+    ASSERT_EQ(d->root()->ModuleInstance.size(), 1u);
+    EXPECT_EQ(d->root()->ModuleInstance[0]->ParamAssignment.size(), 1u);
 }
 
 TEST(Flows, DriverStateDoesNotCarryOverBetweenCalls) {

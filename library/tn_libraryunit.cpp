@@ -1,0 +1,5 @@
+#include "library/tn_libraryunit.h"
+
+Tn_LibraryUnit::~Tn_LibraryUnit() {}
+
+Tn_LibraryUnitVisitor::~Tn_LibraryUnitVisitor() {}
