@@ -94,7 +94,9 @@ module bus_master;
     always #5 clk = ~clk;
 
     function [7:0] expected (input [7:0] a);
-        expected = shadow[a];
+        begin
+            expected = shadow[a];
+        end
     endfunction
 
     task log_value (input [7:0] v);

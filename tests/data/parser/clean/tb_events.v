@@ -86,7 +86,11 @@ module tb_events;
     endtask
 
     function real ratio (input integer part, input integer whole);
-        ratio = whole == 0 ? 0.0 : $itor(part) / $itor(whole);
+        begin
+            ratio = 0.0;
+            if (whole != 0)
+                ratio = $itor(part) / $itor(whole);
+        end
     endfunction
 
     initial begin : main

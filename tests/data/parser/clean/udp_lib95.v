@@ -1,6 +1,7 @@
 // Compact combinational UDP library (Verilog-1995), one primitive per cell,
 // port declarations kept on the header line.  The netlist at the end is a
-// 4-to-1 multiplexer and a parity tree made from these cells.
+// 4-to-1 multiplexer and a parity tree made from these cells; udp_and2 is
+// a spare cell that nothing instantiates.
 
 primitive udp_inv (y, a); output y; input a;
     table
@@ -54,6 +55,14 @@ primitive udp_oai21 (y, a1, a2, b); output y; input a1, a2, b;
         ? ? 0 : 1;
         1 ? 1 : 0;
         ? 1 1 : 0;
+    endtable
+endprimitive
+
+primitive udp_and2 (y, a, b); output y; input a, b;
+    table
+        0 ? : 0;
+        ? 0 : 0;
+        1 1 : 1;
     endtable
 endprimitive
 
