@@ -76,6 +76,17 @@ module add8 (a, b, ci, s, co);
              .pg(pg1), .gg(gg1));
 endmodule
 
+// Port expressions: operand a arrives as two nibble ports, b as one port
+// made of two nets.
+module add8_nibbles (.a_lo(a[3:0]), .a_hi(a[7:4]), .b({b_hi, b_lo}), s, co);
+    input  [7:0] a;
+    input  [3:0] b_hi, b_lo;
+    output [7:0] s;
+    output       co;
+
+    add8 core (a, {b_hi, b_lo}, 1'b0, s, co);
+endmodule
+
 module add8_check (ok);
     output ok;
     reg  [7:0] a, b;

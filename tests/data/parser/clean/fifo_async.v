@@ -80,5 +80,7 @@ module fifo_async #(
     assign rdata = mem[rbin[AW-1:0]];
 
     gray_sync #(.W(AW+1)) sync_r2w (.clk(wclk), .rst_n(wrst_n), .d(rgray), .q(rgray_w));
-    gray_sync #(.W(AW+1)) sync_w2r (.clk(rclk), .rst_n(rrst_n), .d(wgray), .q(wgray_r));
+    generate
+        gray_sync #(.W(AW+1)) sync_w2r (.clk(rclk), .rst_n(rrst_n), .d(wgray), .q(wgray_r));
+    endgenerate
 endmodule

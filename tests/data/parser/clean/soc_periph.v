@@ -36,7 +36,7 @@ module soc_gpio (
                 endcase
         end
 
-    always @*
+    always @(*)
         case (addr)
             2'b00:   rdata = out_r;
             2'b01:   rdata = oe_r;

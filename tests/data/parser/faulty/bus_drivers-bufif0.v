@@ -37,6 +37,9 @@ module bus_fabric (
     wand        all_ack;
     wor         any_ack;
     tri0        strobe_line;
+    triand      ack_and;
+    trior       ack_or;
+    tri   [7:0] data_mirror;
     wire        en_n;
 
     tri_driver8 drv_a (.bus(data_bus), .d(a_data), .oe(a_oe));
@@ -63,4 +66,9 @@ module bus_fabric (
     and  (strong0, strong1) (all_req, all_ack, en);
     or   (any_req, any_ack, 1'b0);
     buf  (strobe, strobe_line);
+
+    // Mirror of the wired results on tri-type nets.
+    assign ack_and = all_ack;
+    assign ack_or  = any_ack;
+    assign data_mirror = data_bus;
 endmodule

@@ -26,11 +26,12 @@ endmodule
 module AND2X1 (Y, A, B);
     output Y;
     input  A, B;
+    specparam tLoad = 0.004;      // module-level specparam
     and (Y, A, B);
     specify
         specparam tA = 0.081, tB = 0.085;
-        (A => Y) = tA;
-        (B => Y) = tB;
+        (A => Y) = (tA + tLoad);
+        (B => Y) = (tB + tLoad);
     endspecify
 endmodule
 

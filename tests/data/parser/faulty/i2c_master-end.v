@@ -47,7 +47,7 @@ module i2c_master #(
 
     assign busy = (state != ST_IDLE);
 
-    always @(posedge clk or negedge rst_n) begin
+    always @(posedge clk, negedge rst_n) begin
         if (!rst_n) begin
             state    <= ST_IDLE;
             phase    <= 2'b00;

@@ -70,6 +70,7 @@ module tb_events;
             req = 4'b0000;
             repeat (3) @(posedge clk);
             rst <= #1 1'b0;
+            req = @(posedge clk) 4'b0000;
             @(negedge clk) -> reset_done;
         end
     endtask
@@ -140,6 +141,8 @@ module tb_events;
         force req[2] = 1'b1;
         repeat (10) @(posedge clk);
         release req[2];
+        req = repeat (2) @(posedge clk) 4'b0000;
+        $display;
 
         // Hold the arbiter in reset through a procedural continuous assignment.
         assign rst = 1'b1;

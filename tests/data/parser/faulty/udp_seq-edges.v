@@ -32,7 +32,7 @@ primitive udp_dff_cp (q, d, clk, clr_n, pre_n);
         0  (x1)   1     1    : 0 : 0;
         1  (x1)   1     1    : 1 : 1;
         ?  (?0)   1     1    : ? : -;   // falling clock
-        *   r     1     1    : ? : -;   // data change
+        *  (?0)   1     1    : ? : -;   // data change
         ?   ?    (?1)   1    : ? : -;   // clear released
         ?   ?     1    (?1)  : ? : -;   // preset released
     endtable
