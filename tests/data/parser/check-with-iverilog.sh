@@ -11,6 +11,20 @@ faulty=0
 [ "${1:-}" = --faulty ] && faulty=1
 pass=0; fail=0; agree=0; differ=0
 
+# Each faulty variant is stored as a unified diff against its clean file;
+# they are made into files in a scratch tree (with clean/ and include/
+# linked in) and compiled there.
+if [ $faulty = 1 ]; then
+    command -v patch >/dev/null 2>&1 || { echo "patch not found (apt-get install patch)" >&2; exit 2; }
+    scratch=$(mktemp -d); trap 'rm -rf "$scratch"' EXIT
+    mkdir "$scratch/faulty"
+    ln -s "$PWD/clean" "$scratch/clean"; ln -s "$PWD/include" "$scratch/include"
+    for d in faulty/*.diff; do
+        base=$(basename "$d" .diff)
+        patch -s -o "$scratch/faulty/$base.v" "clean/${base%-*}.v" < "$d" || exit 2
+    done
+fi
+
 clean() {  # label, command...
     label=$1; shift
     if "$@" >/dev/null 2>&1; then
@@ -23,7 +37,7 @@ clean() {  # label, command...
 fault() {  # label, expected (accepts|rejects), command...
     [ $faulty = 1 ] || return 0
     label=$1; want=$2; shift 2
-    if "$@" >/dev/null 2>&1; then got=accepts; else got=rejects; fi
+    if (cd "$scratch" && "$@" >/dev/null 2>&1); then got=accepts; else got=rejects; fi
     if [ $got = "$want" ]; then
         agree=$((agree + 1)); echo "ok      $label ($got)"
     else

@@ -1,0 +1,34 @@
+// The parser corpus under tests/data/parser: clean compilations, faulty
+// variants stored as unified diffs, and the manifest that says what each
+// variant must draw.
+#ifndef TARN_TESTS_PARSERCORPUS_H
+#define TARN_TESTS_PARSERCORPUS_H
+
+#include <string>
+#include <vector>
+
+#include "tests/support/testfiles.h"
+
+struct CorpusCase {
+    std::string name;  // "<compilation>/<fault>"
+    std::vector<std::string> files, includeDirs, defines;
+    std::string mode;  // "2001" or "1995"
+    std::vector<std::string> tops;
+    std::vector<std::string> faultFiles;
+    std::vector<std::string> faultLevels;    // "error" / "warning", one per message
+    std::vector<std::string> faultMessages;  // exact texts, or "syntax@<file>:<line>"
+    std::string notes;
+};
+
+// Every row of the manifest, in order.
+std::vector<CorpusCase> readParserCorpus();
+// The corpus directory in the source tree.
+std::string parserCorpusDir();
+// Applies a unified diff (as diff -u writes it) to text; throws
+// std::runtime_error when a hunk does not match.
+std::string applyUnifiedDiff(const std::string& original, const std::string& diff);
+// Lays the corpus out in dir as it stands in the source tree, with every
+// faulty variant made into its file under faulty/.
+void materializeParserCorpus(const TempDir& dir);
+
+#endif
