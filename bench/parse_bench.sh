@@ -97,6 +97,8 @@ fi
 have_verilator=0
 [ "$use_verilator" = 1 ] && command -v verilator >/dev/null && have_verilator=1
 
+# Other work on the machine skews the figures: say how busy it was.
+load=$(cut -d' ' -f1 /proc/loadavg)
 results="$work/results.tsv"
 printf 'size\ttool\tlines\tseconds\tpeak_kb\tstatus\n' > "$results"
 log="$work/last-run.log"
@@ -143,7 +145,7 @@ for size in $sizes; do
 done
 
 echo
-echo "Parse benchmark ($(nproc) cores; best of $runs runs; memory is peak RSS)"
+echo "Parse benchmark ($(nproc) cores, load average at start $load; best of $runs runs; memory is peak RSS)"
 echo
 awk -F'\t' '
 NR == 1 { next }
