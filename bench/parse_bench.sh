@@ -100,15 +100,16 @@ have_verilator=0
 # Other work on the machine skews the figures: say how busy it was.
 load=$(cut -d' ' -f1 /proc/loadavg)
 results="$work/results.tsv"
-printf 'size\ttool\tlines\tseconds\tpeak_kb\tstatus\n' > "$results"
+printf 'size\ttool\tlines\tseconds\tcpu_seconds\tpeak_kb\tstatus\n' > "$results"
 log="$work/last-run.log"
 : > "$log"
 
-# measure SIZE TOOL LINES DIR CMD...: best wall time of $runs runs and the
-# largest peak RSS seen, appended to the results.
+# measure SIZE TOOL LINES DIR CMD...: best wall time and best CPU time
+# (user + system, steadier on a busy machine) of $runs runs and the largest
+# peak RSS seen, appended to the results.
 measure() {
     local size=$1 tool=$2 lines=$3 dir=$4; shift 4
-    local best="" peak=0 status=ok t0 t1 ms kb
+    local best="" cpu="" peak=0 status=ok t0 t1 ms kb c
     for _ in $(seq "$runs"); do
         t0=$(date +%s%N)
         (cd "$dir" && /usr/bin/time -v -o "$work/time.txt" "$@") >> "$log" 2>&1
@@ -121,11 +122,14 @@ measure() {
         fi
         ms=$(( (t1 - t0) / 1000000 ))
         kb=$(awk -F': ' '/Maximum resident set size/ {print $2}' "$work/time.txt")
+        c=$(awk -F': ' '/(User|System) time \(seconds\)/ {s += $2} END {printf "%d", s * 1000}' "$work/time.txt")
         if [ -z "$best" ] || [ "$ms" -lt "$best" ]; then best=$ms; fi
+        if [ -z "$cpu" ] || [ "$c" -lt "$cpu" ]; then cpu=$c; fi
         if [ "$kb" -gt "$peak" ]; then peak=$kb; fi
     done
-    printf '%s\t%s\t%s\t%s\t%s\t%s\n' "$size" "$tool" "$lines" \
-        "$(awk -v m="${best:-0}" 'BEGIN{printf "%.3f", m/1000}')" "$peak" "$status" >> "$results"
+    printf '%s\t%s\t%s\t%s\t%s\t%s\t%s\n' "$size" "$tool" "$lines" \
+        "$(awk -v m="${best:-0}" 'BEGIN{printf "%.3f", m/1000}')" \
+        "$(awk -v m="${cpu:-0}" 'BEGIN{printf "%.3f", m/1000}')" "$peak" "$status" >> "$results"
 }
 
 for size in $sizes; do
@@ -151,7 +155,7 @@ awk -F'\t' '
 NR == 1 { next }
 {
     key = $1 SUBSEP $2
-    lines[key] = $3; secs[key] = $4; kb[key] = $5; st[key] = $6
+    lines[key] = $3; secs[key] = $4; cpu[key] = $5; kb[key] = $6; st[key] = $7
     if (!($1 in seen)) { seen[$1] = 1; order[++n] = $1 }
     if (!($2 in tseen)) { tseen[$2] = 1; tools[++m] = $2 }
 }
@@ -159,19 +163,20 @@ function lps(k) { return secs[k] > 0 ? lines[k] / secs[k] : 0 }
 function per100k(k) { return kb[k] / 1024 / (lines[k] / 100000) }
 function ok(k) { return (k in st) && st[k] == "ok" }
 END {
-    printf "%-9s %-10s %9s %9s %12s %10s %12s\n", "size", "tool", "lines", "best s", "lines/s", "peak MB", "MB/100k ln"
+    printf "%-9s %-10s %9s %9s %8s %12s %10s %12s\n", "size", "tool", "lines", "best s", "cpu s", "lines/s", "peak MB", "MB/100k ln"
     for (i = 1; i <= n; i++) for (j = 1; j <= m; j++) {
         k = order[i] SUBSEP tools[j]
         if (!(k in st)) continue
         if (!ok(k)) { printf "%-9s %-10s %9d %9s\n", order[i], tools[j], lines[k], "FAILED (" st[k] ")"; continue }
-        printf "%-9s %-10s %9d %9.3f %12.0f %10.1f %12.1f\n", order[i], tools[j], lines[k], secs[k], lps(k), kb[k] / 1024, per100k(k)
+        printf "%-9s %-10s %9d %9.3f %8.3f %12.0f %10.1f %12.1f\n", order[i], tools[j], lines[k], secs[k], cpu[k], lps(k), kb[k] / 1024, per100k(k)
     }
     print ""
     print "Tarn / yosys (targets: lines/s >= 5.0, memory per line <= 0.5)"
     for (i = 1; i <= n; i++) {
         t = order[i] SUBSEP "tarn"; y = order[i] SUBSEP "yosys"
         if (!ok(t) || !ok(y) || lps(y) == 0 || per100k(y) == 0) continue
-        printf "  %-9s lines/s x%.2f   memory per line x%.2f\n", order[i], lps(t) / lps(y), per100k(t) / per100k(y)
+        printf "  %-9s lines/s x%.2f (by CPU time x%s)   memory per line x%.2f\n", order[i], lps(t) / lps(y),
+               (cpu[t] > 0 ? sprintf("%.2f", cpu[y] / cpu[t]) : "-"), per100k(t) / per100k(y)
     }
     if (n >= 2) {
         lo = order[1]; hi = order[n]
@@ -180,7 +185,9 @@ END {
             a = lo SUBSEP tools[j]; b = hi SUBSEP tools[j]
             if (!ok(a) || !ok(b) || secs[a] == 0 || kb[a] == 0) continue
             g = lines[b] / lines[a]
-            printf "  %-10s time x%.2f (x%.2f per line)   memory x%.2f (x%.2f per line)\n", tools[j], secs[b] / secs[a], secs[b] / secs[a] / g, kb[b] / kb[a], kb[b] / kb[a] / g
+            printf "  %-10s time x%.2f (x%.2f per line; CPU x%s per line)   memory x%.2f (x%.2f per line)\n", tools[j],
+                   secs[b] / secs[a], secs[b] / secs[a] / g, (cpu[a] > 0 ? sprintf("%.2f", cpu[b] / cpu[a] / g) : "-"),
+                   kb[b] / kb[a], kb[b] / kb[a] / g
         }
     }
 }' "$results"
