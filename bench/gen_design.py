@@ -46,6 +46,54 @@ SHIFTS = ("<<", ">>", "<<<", ">>>")
 UNOPS = ["~", "!", "-", "&", "|", "^", "~&", "~|", "~^"]
 
 
+UDPS = """\
+primitive TB_UDP_MUX2 (Y, A, B, S);
+    output Y;
+    input A, B, S;
+    table
+    // A B S : Y
+       0 ? 0 : 0;
+       1 ? 0 : 1;
+       ? 0 1 : 0;
+       ? 1 1 : 1;
+       0 0 x : 0;
+       1 1 x : 1;
+    endtable
+endprimitive
+
+primitive TB_UDP_DFF (Q, D, CK);
+    output Q;
+    reg Q;
+    input D, CK;
+    initial Q = 1'b0;
+    table
+    // D CK : Q : Q+
+       0 (01) : ? : 0;
+       1 (01) : ? : 1;
+       ? (?0) : ? : -;
+       * ?    : ? : -;
+    endtable
+endprimitive
+"""
+
+# The same cells for readers without UDPs (yosys).
+UDPS_AS_MODULES = """\
+module TB_UDP_MUX2 (Y, A, B, S);
+    output Y;
+    input A, B, S;
+    assign Y = S ? B : A;
+endmodule
+
+module TB_UDP_DFF (Q, D, CK);
+    output Q;
+    input D, CK;
+    reg Q;
+    initial Q = 1'b0;
+    always @(posedge CK) Q <= D;
+endmodule
+"""
+
+
 def digest_of_self():
     with open(os.path.abspath(__file__), "rb") as f:
         return hashlib.sha256(f.read()).hexdigest()[:16]
@@ -492,7 +540,6 @@ class Generator:
 
     def netlist(self, budget):
         r = self.rng
-        ex = self.ex
         insts = []
         nets = 0
         pool = ["pi[%d]" % i for i in range(64)]
@@ -567,10 +614,10 @@ class Generator:
         for i in range(0, nets, decl_per_line):
             body.append("    wire " + ", ".join("n%d" % j for j in range(i, min(nets, i + decl_per_line))) + ";")
         body += insts
-        last = [p for p in pool[-64:]]
+        last = pool[-64:]
         while len(last) < 64:
             last.append("1'b0")
-        body.append("    assign \\scan_en  = %s;" % ex.operand([("pi", 64)]))
+        body.append("    assign \\scan_en  = pi[%d];" % r.randrange(64))
         body.append("    assign po = {%s};" % ", ".join(last))
         body += ["endmodule", ""]
         f = SourceFile("netlist.v")
@@ -646,54 +693,13 @@ class Generator:
     @staticmethod
     def udp_file():
         f = SourceFile("udps.v")
-        f.add(["primitive TB_UDP_MUX2 (Y, A, B, S);",
-               "    output Y;",
-               "    input A, B, S;",
-               "    table",
-               "    // A B S : Y",
-               "       0 ? 0 : 0;",
-               "       1 ? 0 : 1;",
-               "       ? 0 1 : 0;",
-               "       ? 1 1 : 1;",
-               "       0 0 x : 0;",
-               "       1 1 x : 1;",
-               "    endtable",
-               "endprimitive",
-               "",
-               "primitive TB_UDP_DFF (Q, D, CK);",
-               "    output Q;",
-               "    reg Q;",
-               "    input D, CK;",
-               "    initial Q = 1'b0;",
-               "    table",
-               "    // D CK : Q : Q+",
-               "       0 (01) : ? : 0;",
-               "       1 (01) : ? : 1;",
-               "       ? (?0) : ? : -;",
-               "       * ?    : ? : -;",
-               "    endtable",
-               "endprimitive",
-               ""])
+        f.add(UDPS.splitlines())
         return f
 
     @staticmethod
     def udp_module_file():
         f = SourceFile("udps_as_modules.v")
-        f.add(["// The UDPs of udps.v as modules, for readers without UDP support.",
-               "module TB_UDP_MUX2 (Y, A, B, S);",
-               "    output Y;",
-               "    input A, B, S;",
-               "    assign Y = S ? B : A;",
-               "endmodule",
-               "",
-               "module TB_UDP_DFF (Q, D, CK);",
-               "    output Q;",
-               "    input D, CK;",
-               "    reg Q;",
-               "    initial Q = 1'b0;",
-               "    always @(posedge CK) Q <= D;",
-               "endmodule",
-               ""])
+        f.add(UDPS_AS_MODULES.splitlines())
         return f
 
     def top_file(self):
