@@ -4,7 +4,7 @@
 # time (best of N), lines per second, peak memory and the Tarn/yosys ratios.
 #
 # Usage: bench/parse_bench.sh [options]
-#   --tarn PATH        tarn binary (default build-bench/tarn, built if missing)
+#   --tarn PATH        tarn binary (default build-bench/tarn, built or brought up to date)
 #   --no-tarn          time the peers only
 #   --sizes "N ..."    design sizes in lines (default "250000 500000 1000000")
 #   --runs N           timed runs per tool and size; the best is kept (default 3)
@@ -84,12 +84,13 @@ fi
 
 if [ "$use_tarn" = 1 ]; then
     if [ -z "$tarn" ]; then
+        # Brought up to date first, so the figures are those of the sources.
         tarn="$root/build-bench/tarn"
-        if [ ! -x "$tarn" ]; then
-            echo "parse_bench: building $tarn (Release)" >&2
-            cmake -S . -B build-bench -G Ninja -DCMAKE_BUILD_TYPE=Release -DTARN_BENCH=ON >/dev/null &&
-                cmake --build build-bench --target tarn-cli >/dev/null || exit 1
+        if [ ! -f build-bench/build.ninja ]; then
+            cmake -S . -B build-bench -G Ninja -DCMAKE_BUILD_TYPE=Release -DTARN_BENCH=ON >/dev/null || exit 1
         fi
+        echo "parse_bench: building $tarn" >&2
+        cmake --build build-bench --target tarn-cli >/dev/null || exit 1
     fi
     [ -x "$tarn" ] || { echo "parse_bench: no tarn binary at '$tarn'" >&2; exit 1; }
     tarn=$(cd "$(dirname "$tarn")" && pwd)/$(basename "$tarn")
@@ -193,3 +194,5 @@ END {
 }' "$results"
 echo
 echo "raw figures: $results; tool output: $log"
+# A run that failed makes the whole benchmark fail, after the table.
+! cut -f7 "$results" | grep -q '^exit'
