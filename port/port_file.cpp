@@ -36,6 +36,11 @@ bool File::mkdir(const char* name) {
     return errno == EEXIST && isdir(name);
 }
 
+bool File::sameFile(const char* a, const char* b) {
+    struct stat sa, sb;
+    return a && b && ::stat(a, &sa) == 0 && ::stat(b, &sb) == 0 && sa.st_dev == sb.st_dev && sa.st_ino == sb.st_ino;
+}
+
 int64_t File::getdatetime(const char* name) {
     struct stat st;
     if (!name || ::stat(name, &st) != 0) return 0;

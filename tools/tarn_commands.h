@@ -13,5 +13,6 @@ int tarnCompile(const TarnArgs& args);
 int tarnParse(const TarnArgs& args);
 int tarnElaborate(const TarnArgs& args);
 int tarnData(const TarnArgs& args);
+int tarnTokens(const TarnArgs& args);
 
 #endif

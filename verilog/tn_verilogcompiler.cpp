@@ -11,7 +11,7 @@
 #include "verilog/tn_verilogdesignunit.h"
 #include "verilog/tn_verilognodes.h"
 
-Tn_VerilogCompiler::Tn_VerilogCompiler() {}
+Tn_VerilogCompiler::Tn_VerilogCompiler() : lexer_(options_, directives_), filter_(lexer_) {}
 
 Tn_VerilogCompiler::~Tn_VerilogCompiler() {}
 
@@ -38,9 +38,20 @@ int Tn_VerilogCompiler::run(Flow flow, const Tn_StringList& args) {
 }
 
 // Common opening: options, then the preprocessor's state and command-line macros.
-void Tn_VerilogCompiler::open(Flow /*flow*/, const Tn_StringList& args) {
+void Tn_VerilogCompiler::open(Flow flow, const Tn_StringList& args) {
     options_.parse(args);
-    files_.clear();
+    // Status lines name the library when units are not elaborated right away.
+    if (flow == COMPILE) lexer_.setAnnounceLibrary(!options_.recursive());
+    if (flow == PARSE) lexer_.setAnnounceLibrary(true);
+    directives_.reset(options_.macroDefinitions());
+}
+
+bool Tn_VerilogCompiler::scanSources(const Tn_StringList& args) {
+    checkpoint_.reset();
+    open(COMPILE, args);
+    if (errorsSoFar()) return false;
+    lexer_.startFiles(options_.sourceFiles());
+    return true;
 }
 
 void Tn_VerilogCompiler::compileFlow() {
@@ -71,7 +82,15 @@ void Tn_VerilogCompiler::elaborateFlow() {
 }
 
 void Tn_VerilogCompiler::parseSources(Tn_Library& /*work*/, Tn_StringList* /*compiled*/) {
-    // The scanner and parser fill the work library here.
+    // Until the parser reads them, the tokens are only scanned: directives,
+    // includes and macros take effect and scanner errors are reported.
+    lexer_.startFiles(options_.sourceFiles());
+    try {
+        while (filter_.nextToken()->getType() != antlr::Token::EOF_TYPE) {
+        }
+    } catch (const antlr::TokenStreamRecognitionException& e) {
+        Tn_VerilogLexer::report(e);
+    }
 }
 
 Tn_StringList Tn_VerilogCompiler::topUnits(Tn_Library& work) {

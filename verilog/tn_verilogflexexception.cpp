@@ -1,0 +1,3 @@
+#include "verilog/tn_verilogflexexception.h"
+
+Tn_VerilogFlexException::~Tn_VerilogFlexException() throw() {}
