@@ -13,9 +13,16 @@ Stream* File::open(const char* name, int access, int /*flags*/) {
         mode = "ab";
     else if (access & WRITE)
         mode = (access & READ) ? "r+b" : "wb";
-    if (isdir(name)) return nullptr;  // fopen succeeds on directories for reading
     std::FILE* f = std::fopen(name, mode);
-    return f ? new Stream(f, true) : nullptr;
+    if (!f) return nullptr;
+    // fopen succeeds on directories for reading.
+    Stream* s = new Stream(f, true);
+    Stream::FileId id;
+    if (s->fileId(id) && id.directory) {
+        delete s;
+        return nullptr;
+    }
+    return s;
 }
 
 void File::close(Stream* s) { delete s; }
@@ -34,11 +41,6 @@ bool File::mkdir(const char* name) {
     if (!name || !*name) return false;
     if (::mkdir(name, 0777) == 0) return true;
     return errno == EEXIST && isdir(name);
-}
-
-bool File::sameFile(const char* a, const char* b) {
-    struct stat sa, sb;
-    return a && b && ::stat(a, &sa) == 0 && ::stat(b, &sb) == 0 && sa.st_dev == sb.st_dev && sa.st_ino == sb.st_ino;
 }
 
 int64_t File::getdatetime(const char* name) {

@@ -23,8 +23,6 @@ public:
     static bool isdir(const char* name);
     // Creates one directory level; true when it exists afterwards.
     static bool mkdir(const char* name);
-    // True when both names reach the same existing file (however spelled).
-    static bool sameFile(const char* a, const char* b);
     // Modification time in seconds since the epoch; 0 when unknown.
     static int64_t getdatetime(const char* name);
 

@@ -1,5 +1,7 @@
 #include "port/port_stream.h"
 
+#include <sys/stat.h>
+
 namespace Port {
 
 Stream::~Stream() {
@@ -9,6 +11,22 @@ Stream::~Stream() {
 size_t Stream::read(void* buf, size_t size) { return (f_ && size) ? std::fread(buf, 1, size, f_) : 0; }
 
 size_t Stream::write(const void* buf, size_t size) { return (f_ && size) ? std::fwrite(buf, 1, size, f_) : 0; }
+
+bool Stream::fileId(FileId& id) const {
+    if (idState_ == 0) {
+        struct stat st;
+        idState_ = (f_ && ::fstat(fileno(f_), &st) == 0) ? 1 : -1;
+        if (idState_ > 0) {
+            id_.device = static_cast<uint64_t>(st.st_dev);
+            id_.inode = static_cast<uint64_t>(st.st_ino);
+            id_.size = static_cast<int64_t>(st.st_size);
+            id_.regular = S_ISREG(st.st_mode);
+            id_.directory = S_ISDIR(st.st_mode);
+        }
+    }
+    id = id_;
+    return idState_ > 0;
+}
 
 bool Stream::geteof() const { return !f_ || std::feof(f_) != 0; }
 

@@ -30,9 +30,23 @@ public:
 
     std::FILE* handle() const { return f_; }
 
+    // What the open file is: two streams with equal device and inode read
+    // the same file; size is meaningful for regular files. False without a file.
+    struct FileId {
+        uint64_t device;
+        uint64_t inode;
+        int64_t size;
+        bool regular;
+        bool directory;
+    };
+    bool fileId(FileId& id) const;
+
 private:
     std::FILE* f_;
     bool owned_;
+    // fileId() asks the system once.
+    mutable FileId id_ = FileId();
+    mutable int idState_ = 0;  // 0 not asked, 1 known, -1 failed
 };
 
 }  // namespace Port

@@ -8,7 +8,7 @@
 
 #include "tools/tarn_commands.h"
 #include "verilog/tn_verilogcompiler.h"
-#include "verilog/tn_verilogtoken.h"
+#include "verilog/tn_veriloglexer.h"
 
 int tarnTokens(const TarnArgs& args) {
     TarnArgs verilogArgs = args;

@@ -10,12 +10,20 @@
 #include "verilog/tn_verilogdesign.h"
 #include "verilog/tn_verilogdesignunit.h"
 #include "verilog/tn_verilognodes.h"
+#include "verilog/tn_verilogdirectivestate.h"
+#include "verilog/tn_veriloglexer.h"
+#include "verilog/tn_verilogtokenstreamfilter.h"
 
-Tn_VerilogCompiler::Tn_VerilogCompiler() : lexer_(options_, directives_), filter_(lexer_) {}
+Tn_VerilogCompiler::Tn_VerilogCompiler()
+    : directives_(new Tn_VerilogDirectiveState()),
+      lexer_(new Tn_VerilogLexer(options_, *directives_)),
+      filter_(new Tn_VerilogTokenStreamFilter(*lexer_)) {}
 
 Tn_VerilogCompiler::~Tn_VerilogCompiler() {}
 
 std::unique_ptr<Tn_VerilogDesign> Tn_VerilogCompiler::takeResult() { return std::move(result_); }
+
+const Tn_VerilogFileList& Tn_VerilogCompiler::sourceFiles() const { return lexer_->fileList(); }
 
 int Tn_VerilogCompiler::compile(const Tn_StringList& args) { return run(COMPILE, args); }
 int Tn_VerilogCompiler::parse(const Tn_StringList& args) { return run(PARSE, args); }
@@ -41,16 +49,16 @@ int Tn_VerilogCompiler::run(Flow flow, const Tn_StringList& args) {
 void Tn_VerilogCompiler::open(Flow flow, const Tn_StringList& args) {
     options_.parse(args);
     // Status lines name the library when units are not elaborated right away.
-    if (flow == COMPILE) lexer_.setAnnounceLibrary(!options_.recursive());
-    if (flow == PARSE) lexer_.setAnnounceLibrary(true);
-    directives_.reset(options_.macroDefinitions());
+    if (flow == COMPILE) lexer_->setAnnounceLibrary(!options_.recursive());
+    if (flow == PARSE) lexer_->setAnnounceLibrary(true);
+    directives_->reset(options_.macroDefinitions());
 }
 
 bool Tn_VerilogCompiler::scanSources(const Tn_StringList& args) {
     checkpoint_.reset();
     open(COMPILE, args);
     if (errorsSoFar()) return false;
-    lexer_.startFiles(options_.sourceFiles());
+    lexer_->startFiles(options_.sourceFiles());
     return true;
 }
 
@@ -84,9 +92,9 @@ void Tn_VerilogCompiler::elaborateFlow() {
 void Tn_VerilogCompiler::parseSources(Tn_Library& /*work*/, Tn_StringList* /*compiled*/) {
     // Until the parser reads them, the tokens are only scanned: directives,
     // includes and macros take effect and scanner errors are reported.
-    lexer_.startFiles(options_.sourceFiles());
+    lexer_->startFiles(options_.sourceFiles());
     try {
-        while (filter_.nextToken()->getType() != antlr::Token::EOF_TYPE) {
+        while (filter_->nextToken()->getType() != antlr::Token::EOF_TYPE) {
         }
     } catch (const antlr::TokenStreamRecognitionException& e) {
         Tn_VerilogLexer::report(e);

@@ -7,14 +7,14 @@
 
 #include "src/tn_verilogoptions.h"
 #include "util/tn_messagecheckpoint.h"
-#include "verilog/tn_verilogdirectivestate.h"
 #include "verilog/tn_verilogfilelist.h"
-#include "verilog/tn_veriloglexer.h"
-#include "verilog/tn_verilogtokenstreamfilter.h"
 
 class Tn_Library;
 class Tn_VerilogDesign;
 class Tn_VerilogModuleInstance;
+class Tn_VerilogDirectiveState;
+class Tn_VerilogLexer;
+class Tn_VerilogTokenStreamFilter;
 
 class Tn_VerilogCompiler {
 public:
@@ -39,14 +39,14 @@ public:
     // The result design; the driver's slot becomes null.
     std::unique_ptr<Tn_VerilogDesign> takeResult();
     // The files read in this call.
-    const Tn_VerilogFileList& sourceFiles() const { return lexer_.fileList(); }
+    const Tn_VerilogFileList& sourceFiles() const;
     const Tn_VerilogOptions& options() const { return options_; }
 
     // The compile flow's opening, then the scanner started on the source
     // files, whose tokens the caller reads from lexer() (tarn tokens). False
     // when the options had errors.
     bool scanSources(const Tn_StringList& args);
-    Tn_VerilogLexer& lexer() { return lexer_; }
+    Tn_VerilogLexer& lexer() { return *lexer_; }
 
 private:
     enum Flow { COMPILE, PARSE, ELABORATE };
@@ -69,9 +69,10 @@ private:
     void applyOverrides(Tn_VerilogDesign& design, Tn_VerilogModuleInstance& inst);
 
     Tn_VerilogOptions options_;
-    Tn_VerilogDirectiveState directives_;
-    Tn_VerilogLexer lexer_;
-    Tn_VerilogTokenStreamFilter filter_;
+    // The front end's state, created with the driver in this order.
+    std::unique_ptr<Tn_VerilogDirectiveState> directives_;
+    std::unique_ptr<Tn_VerilogLexer> lexer_;
+    std::unique_ptr<Tn_VerilogTokenStreamFilter> filter_;
     std::unique_ptr<Tn_VerilogDesign> result_;
     Tn_MessageCheckpoint checkpoint_;
 };

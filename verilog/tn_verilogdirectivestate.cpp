@@ -2,20 +2,24 @@
 
 #include <algorithm>
 #include <cctype>
+#include <string_view>
 
 namespace {
 
-bool inList(const char* const* list, const Port_String& name) {
-    for (; *list; ++list)
-        if (name == *list) return true;
+// Called for every macro reference: string_view compares lengths first.
+template <size_t N>
+bool inList(const std::string_view (&list)[N], const Port_String& name) {
+    const std::string_view n(name.str());
+    for (const std::string_view& entry : list)
+        if (entry == n) return true;
     return false;
 }
 
-const char* const kDirectives1995[] = {"celldefine", "default_nettype", "define", "else", "endcelldefine",
-                                       "endif", "ifdef", "include", "nounconnected_drive", "resetall",
-                                       "timescale", "unconnected_drive", "undef", nullptr};
-const char* const kDirectives2001[] = {"elsif", "ifndef", "line", nullptr};
-const char* const kNetTypes[] = {"wire", "tri", "tri0", "wand", "triand", "tri1", "wor", "trior", "trireg", nullptr};
+constexpr std::string_view kDirectives1995[] = {"celldefine", "default_nettype", "define", "else", "endcelldefine",
+                                                "endif", "ifdef", "include", "nounconnected_drive", "resetall",
+                                                "timescale", "unconnected_drive", "undef"};
+constexpr std::string_view kDirectives2001[] = {"elsif", "ifndef", "line"};
+constexpr std::string_view kNetTypes[] = {"wire", "tri", "tri0", "wand", "triand", "tri1", "wor", "trior", "trireg"};
 
 struct TimeLiteral {
     const char* text;

@@ -1,5 +1,6 @@
 #include "verilog/tn_verilogflexlexer.h"
 
+#include <algorithm>
 #include <boost/regex.hpp>
 #include <cctype>
 #include <climits>
@@ -8,7 +9,6 @@
 #include <cstdlib>
 #include <cstring>
 #include <string_view>
-#include <unordered_map>
 
 #include "port/port_file.h"
 #include "util/tn_message.h"
@@ -20,11 +20,13 @@ namespace {
 // Bytes asked of a file at a time, and the scanner buffer over it.
 const int kFileBufferSize = 64 * 1024;
 
-// Keyword and timing-check tables, made from the token list.
+// Keyword and timing-check tables, made from the token list: one lookup per
+// identifier, so an open-addressing table with a cheap hash.
 class KeywordTable {
 public:
     enum Kind { KEYWORD, KEYWORD_2001, TIMING_CHECK, FIXED, LITERAL };
     struct Entry {
+        std::string_view text;
         int type;
         bool only2001;
     };
@@ -40,28 +42,45 @@ public:
 #include "verilog/tn_verilogtokens.def"
 #undef TN_TOKEN
         };
-        for (const Row& r : rows) {
-            if (r.kind == KEYWORD || r.kind == KEYWORD_2001) words_[r.text] = Entry{r.type, r.kind == KEYWORD_2001};
-            if (r.kind == TIMING_CHECK) timingChecks_[r.text] = r.type;
+        for (const Row& r : rows)
+            if (r.kind == KEYWORD || r.kind == KEYWORD_2001 || r.kind == TIMING_CHECK)
+                insert(Entry{r.text, r.type, r.kind == KEYWORD_2001});
+    }
+    // The keyword (or, for "$..." texts, the timing check) of that text.
+    const Entry* find(std::string_view text) const {
+        for (size_t i = hash(text);; i = (i + 1) & kMask) {
+            const Entry& e = slots_[i];
+            if (e.text.empty()) return nullptr;
+            if (e.text == text) return &e;
         }
-    }
-    const Entry* word(std::string_view text) const {
-        auto it = words_.find(text);
-        return it == words_.end() ? nullptr : &it->second;
-    }
-    int timingCheck(std::string_view text) const {
-        auto it = timingChecks_.find(text);
-        return it == timingChecks_.end() ? 0 : it->second;
     }
 
 private:
-    std::unordered_map<std::string_view, Entry> words_;
-    std::unordered_map<std::string_view, int> timingChecks_;
+    static constexpr size_t kSlots = 512;  // a power of two, well above the 136 entries
+    static constexpr size_t kMask = kSlots - 1;
+    static size_t hash(std::string_view s) {
+        size_t h = s.size();
+        for (char c : s) h = h * 31 + static_cast<unsigned char>(c);
+        return h & kMask;
+    }
+    void insert(const Entry& e) {
+        size_t i = hash(e.text);
+        while (!slots_[i].text.empty()) i = (i + 1) & kMask;
+        slots_[i] = e;
+    }
+    Entry slots_[kSlots] = {};
 };
 
 const KeywordTable& keywords() {
     static const KeywordTable table;
     return table;
+}
+
+// Small files get a buffer of their size.
+int fileBufferSize(const Tn_VerilogScannerState::Input& in) {
+    const Port::Stream::FileId* id = in.fileId();
+    if (id && id->regular && id->size + 2 < kFileBufferSize) return static_cast<int>(id->size) + 2;
+    return kFileBufferSize;
 }
 
 bool isIdentChar(char c) { return std::isalnum(static_cast<unsigned char>(c)) || c == '_' || c == '$'; }
@@ -73,12 +92,9 @@ Port_String trailingWord(const char* text, int length) {
     return Port_String(text + start, length - start);
 }
 
-std::string withoutUnderscores(const char* text, int length) {
-    std::string s;
-    s.reserve(static_cast<size_t>(length));
-    for (int i = 0; i < length; ++i)
-        if (text[i] != '_') s += text[i];
-    return s;
+void assignWithoutUnderscores(std::string& s, const char* text, int length) {
+    s.assign(text, static_cast<size_t>(length));
+    if (std::memchr(text, '_', static_cast<size_t>(length))) s.erase(std::remove(s.begin(), s.end(), '_'), s.end());
 }
 
 std::string withoutWhiteSpace(const std::string& s) {
@@ -328,7 +344,8 @@ void Tn_VerilogFlexLexer::openSourceFile(const Port_String& path) {
                              state_.options().workLibrary().c_str());
     else
         TN_MSG().issueStatus("Compiling verilog file \"%s\"\n", path.c_str());
-    pushInput(new Tn_VerilogScannerState::Input(Tn_VerilogScannerState::Input::SOURCE_FILE, path, s), kFileBufferSize);
+    Tn_VerilogScannerState::Input* in = new Tn_VerilogScannerState::Input(Tn_VerilogScannerState::Input::SOURCE_FILE, path, s);
+    pushInput(in, fileBufferSize(*in));
     state_.setFile(path);
     state_.line = 1;
     state_.column = 1;
@@ -502,38 +519,39 @@ void Tn_VerilogFlexLexer::include() {
     std::string name(open + 1, static_cast<size_t>(yytext + yyleng - 1 - (open + 1)));
     for (size_t i = 0; (i = name.find("\\\"", i)) != std::string::npos;) name.replace(i, 2, "\"");
 
-    Port_String path;
-    if (Port::File::isfile(name.c_str())) path = name;
+    // The name as given (relative to the current directory), then in each
+    // include directory; the first that opens as a file wins.
+    Port_String path(name);
+    Port::Stream* s = Port::File::open(path.c_str(), Port::File::READ);
     for (const Port_String& dir : state_.options().includeDirectories()) {
-        if (!path.IsEmpty()) break;
-        const Port_String candidate = dir + "/" + name.c_str();
-        if (Port::File::isfile(candidate.c_str())) path = candidate;
+        if (s) break;
+        path = dir + "/" + name.c_str();
+        s = Port::File::open(path.c_str(), Port::File::READ);
     }
-    if (path.IsEmpty()) {
+    if (!s) {
         if (strict_) raise("Could not find verilog include file '%s'", name.c_str());
         TN_MSG().issueWarning("%sCould not find include file '%s'\n", state_.locationText().c_str(), name.c_str());
         return;
     }
+    std::unique_ptr<Tn_VerilogScannerState::Input> in(
+        new Tn_VerilogScannerState::Input(Tn_VerilogScannerState::Input::INCLUDE_FILE, path, s));
     int depth = 0;
-    for (const auto& in : state_.inputs) {
-        if (!in->isFile()) continue;
+    for (const auto& open : state_.inputs) {
+        if (!open->isFile()) continue;
         ++depth;
-        if (Port::File::sameFile(in->name().c_str(), path.c_str()))
+        if (in->fileId() && open->sameFile(*in->fileId()))
             raise("Recursive include of verilog include file '%s'", path.c_str());
     }
     if (depth > kMaxIncludeDepth)
         raise("Verilog include files nested more than %d deep at '%s'", kMaxIncludeDepth, path.c_str());
-    Port::Stream* s = Port::File::open(path.c_str(), Port::File::READ);
-    if (!s) raise("Could not open file %s", path.c_str());
 
     state_.fileList.addInclude(path, state_.currentFilePath());
     TN_MSG().issueStatus("Compiling verilog include file \"%s\"\n", path.c_str());
-    Tn_VerilogScannerState::Input* in =
-        new Tn_VerilogScannerState::Input(Tn_VerilogScannerState::Input::INCLUDE_FILE, path, s);
     in->returnFile = state_.file;
     in->returnLine = state_.line;
     in->returnColumn = state_.column;
-    pushInput(in, kFileBufferSize);
+    const int size = fileBufferSize(*in);
+    pushInput(in.release(), size);
     state_.setFile(path);
     state_.line = 1;
     state_.column = 1;
@@ -697,7 +715,7 @@ int Tn_VerilogFlexLexer::token(int type) {
 
 int Tn_VerilogFlexLexer::identifier() {
     state_.text.assign(yytext, static_cast<size_t>(yyleng));
-    const KeywordTable::Entry* k = keywords().word(std::string_view(yytext, static_cast<size_t>(yyleng)));
+    const KeywordTable::Entry* k = keywords().find(std::string_view(yytext, static_cast<size_t>(yyleng)));
     if (!k) return IDENTIFIER;
     if (k->only2001 && !verilog2001_) {
         TN_MSG().issueWarning("%s'%s' is a reserved word in Verilog-2001\n", state_.locationText().c_str(), yytext);
@@ -710,12 +728,12 @@ int Tn_VerilogFlexLexer::identifier() {
 
 int Tn_VerilogFlexLexer::systemIdentifier() {
     state_.text.assign(yytext, static_cast<size_t>(yyleng));
-    const int type = keywords().timingCheck(std::string_view(yytext, static_cast<size_t>(yyleng)));
-    return type ? type : int(SYSTEM_IDENTIFIER);
+    const KeywordTable::Entry* k = keywords().find(std::string_view(yytext, static_cast<size_t>(yyleng)));
+    return k ? k->type : int(SYSTEM_IDENTIFIER);
 }
 
 int Tn_VerilogFlexLexer::number(int type) {
-    state_.text = withoutUnderscores(yytext, yyleng);
+    assignWithoutUnderscores(state_.text, yytext, yyleng);
     return type;
 }
 

@@ -21,7 +21,7 @@ antlr::RefToken Tn_VerilogLexer::nextToken() {
         scanner_.resetInput();
         throw antlr::TokenStreamRecognitionException(e);
     }
-    const Tn_VerilogScannerState& s = scanner_.state();
+    Tn_VerilogScannerState& s = scanner_.state();
     return antlr::RefToken(new Tn_VerilogToken(type, s.text, s.file, s.line, s.column));
 }
 

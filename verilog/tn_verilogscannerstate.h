@@ -10,13 +10,11 @@
 #include <string>
 #include <vector>
 
+#include "port/port_stream.h"
 #include "src/tn_verilogoptions.h"
 #include "util/tn_rcstring.h"
 #include "verilog/tn_verilogfilelist.h"
 
-namespace Port {
-class Stream;
-}
 class Tn_VerilogDirectiveState;
 
 class Tn_VerilogScannerState {
@@ -44,6 +42,10 @@ public:
         const Port_String& name() const { return name_; }
         // Length of a text input (a macro expansion).
         size_t textLength() const { return text_.size(); }
+        // Whether this input reads the same file as a stream (however the
+        // two were named); the size of a regular file (-1 when unknown).
+        bool sameFile(const Port::Stream::FileId& id) const;
+        const Port::Stream::FileId* fileId() const { return hasId_ ? &id_ : nullptr; }
 
         // Where scanning resumes when this input ends (set for includes and
         // macro expansions).
@@ -55,6 +57,9 @@ public:
         Kind kind_;
         Port_String name_;
         Port::Stream* stream_;
+        Port::Stream::FileId id_;
+        bool hasId_ = false;
+        bool ended_ = false;
         std::string text_;
         size_t pos_ = 0;
     };

@@ -27,10 +27,10 @@ const std::string& emptyName() {
 
 }  // namespace
 
-Tn_VerilogToken::Tn_VerilogToken(int type, const std::string& text, const Tn_RCStringPtr& file, int line, int column)
-    : antlr::CommonHiddenStreamToken(type, text), file_(file) {
-    setLine(line);
-    setColumn(column);
+Tn_VerilogToken::Tn_VerilogToken(int type, const std::string& txt, const Tn_RCStringPtr& file, int atLine, int atColumn)
+    : antlr::CommonHiddenStreamToken(type, txt), file_(file) {
+    line = atLine;
+    col = atColumn;
 }
 
 Tn_VerilogToken::~Tn_VerilogToken() {}
