@@ -1,0 +1,37 @@
+// Runs the scanner over sources the way a compilation opens it (options,
+// directive reset, +define+ macros) and collects every token.
+#ifndef TARN_TESTS_SCAN_H
+#define TARN_TESTS_SCAN_H
+
+#include <string>
+#include <vector>
+
+#include "tests/support/testfiles.h"
+
+struct ScannedToken {
+    int type;
+    std::string text;
+    std::string file;
+    int line;
+    int column;
+};
+
+struct ScanResult {
+    std::vector<ScannedToken> tokens;  // up to and including EOF, or up to the error
+    bool failed = false;               // a scanner error ended the scan
+    std::string error;                 // its message, file and line
+    std::string errorFile;
+    int errorLine = 0;
+
+    // Texts of the tokens before EOF, joined by single blanks.
+    std::string text() const;
+    std::vector<int> types() const;
+};
+
+// Scans with a Verilog command line ("tarn" is put in front).
+ScanResult scanArgs(const std::vector<std::string>& args);
+// Writes source to dir/name and scans it, with further arguments after it.
+ScanResult scanSource(const TempDir& dir, const std::string& source, const std::vector<std::string>& args = {},
+                      const std::string& name = "t.v");
+
+#endif
