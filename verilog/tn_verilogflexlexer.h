@@ -34,7 +34,7 @@ public:
     // nested macro expansions (a macro that expands to itself), the text they
     // hold, and nested include files.
     static constexpr int kMaxExpansionDepth = 1000;
-    static constexpr size_t kMaxExpansionBytes = size_t(64) << 20;
+    static constexpr size_t kMaxExpansionBytes = size_t(16) << 20;
     static constexpr int kMaxIncludeDepth = 200;
 
     Tn_VerilogFlexLexer(const Tn_VerilogOptions& options, Tn_VerilogDirectiveState& directives);

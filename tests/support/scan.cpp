@@ -1,6 +1,7 @@
 #include "tests/support/scan.h"
 
 #include "verilog/tn_verilogcompiler.h"
+#include "verilog/tn_verilogdirectivestate.h"
 #include "verilog/tn_veriloglexer.h"
 #include "verilog/tn_verilogtokentypes.h"
 
@@ -21,19 +22,13 @@ std::vector<int> ScanResult::types() const {
     return r;
 }
 
-ScanResult scanArgs(const std::vector<std::string>& args) {
-    Tn_StringList list{Port_String("tarn")};
-    for (const std::string& a : args) list.push_back(Port_String(a));
+namespace {
+
+ScanResult drain(Tn_VerilogLexer& lexer) {
     ScanResult r;
-    Tn_VerilogCompiler driver;
-    if (!driver.scanSources(list)) {
-        r.failed = true;
-        r.error = "options";
-        return r;
-    }
     try {
         for (;;) {
-            antlr::RefToken t = driver.lexer().nextToken();
+            antlr::RefToken t = lexer.nextToken();
             r.tokens.push_back(ScannedToken{t->getType(), t->getText(), t->getFilename(), t->getLine(), t->getColumn()});
             if (t->getType() == Tn_VerilogTokenTypes::EOF_) break;
         }
@@ -46,9 +41,34 @@ ScanResult scanArgs(const std::vector<std::string>& args) {
     return r;
 }
 
+}  // namespace
+
+ScanResult scanArgs(const std::vector<std::string>& args, bool strict) {
+    Tn_StringList list{Port_String("tarn")};
+    for (const std::string& a : args) list.push_back(Port_String(a));
+    if (!strict) {
+        Tn_VerilogOptions options;
+        options.parse(list);
+        options.setStrictPreprocessing(false);
+        Tn_VerilogDirectiveState directives;
+        directives.reset(options.macroDefinitions());
+        Tn_VerilogLexer lexer(options, directives);
+        lexer.startFiles(options.sourceFiles());
+        return drain(lexer);
+    }
+    Tn_VerilogCompiler driver;
+    if (!driver.scanSources(list)) {
+        ScanResult r;
+        r.failed = true;
+        r.error = "options";
+        return r;
+    }
+    return drain(driver.lexer());
+}
+
 ScanResult scanSource(const TempDir& dir, const std::string& source, const std::vector<std::string>& args,
-                      const std::string& name) {
+                      const std::string& name, bool strict) {
     std::vector<std::string> all{dir.write(name, source)};
     all.insert(all.end(), args.begin(), args.end());
-    return scanArgs(all);
+    return scanArgs(all, strict);
 }

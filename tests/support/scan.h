@@ -28,10 +28,12 @@ struct ScanResult {
     std::vector<int> types() const;
 };
 
-// Scans with a Verilog command line ("tarn" is put in front).
-ScanResult scanArgs(const std::vector<std::string>& args);
+// Scans with a Verilog command line ("tarn" is put in front). Without
+// strict, missing includes and undefined macros are only warnings (as in the
+// data compiler's flow).
+ScanResult scanArgs(const std::vector<std::string>& args, bool strict = true);
 // Writes source to dir/name and scans it, with further arguments after it.
 ScanResult scanSource(const TempDir& dir, const std::string& source, const std::vector<std::string>& args = {},
-                      const std::string& name = "t.v");
+                      const std::string& name = "t.v", bool strict = true);
 
 #endif
