@@ -22,9 +22,7 @@ std::vector<int> ScanResult::types() const {
     return r;
 }
 
-namespace {
-
-ScanResult drain(Tn_VerilogLexer& lexer) {
+ScanResult drainTokens(Tn_VerilogLexer& lexer) {
     ScanResult r;
     try {
         for (;;) {
@@ -41,8 +39,6 @@ ScanResult drain(Tn_VerilogLexer& lexer) {
     return r;
 }
 
-}  // namespace
-
 ScanResult scanArgs(const std::vector<std::string>& args, bool strict) {
     Tn_StringList list{Port_String("tarn")};
     for (const std::string& a : args) list.push_back(Port_String(a));
@@ -54,7 +50,7 @@ ScanResult scanArgs(const std::vector<std::string>& args, bool strict) {
         directives.reset(options.macroDefinitions());
         Tn_VerilogLexer lexer(options, directives);
         lexer.startFiles(options.sourceFiles());
-        return drain(lexer);
+        return drainTokens(lexer);
     }
     Tn_VerilogCompiler driver;
     if (!driver.scanSources(list)) {
@@ -63,7 +59,7 @@ ScanResult scanArgs(const std::vector<std::string>& args, bool strict) {
         r.error = "options";
         return r;
     }
-    return drain(driver.lexer());
+    return drainTokens(driver.lexer());
 }
 
 ScanResult scanSource(const TempDir& dir, const std::string& source, const std::vector<std::string>& args,

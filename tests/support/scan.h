@@ -28,6 +28,10 @@ struct ScanResult {
     std::vector<int> types() const;
 };
 
+class Tn_VerilogLexer;
+// Reads every token of a started lexer.
+ScanResult drainTokens(Tn_VerilogLexer& lexer);
+
 // Scans with a Verilog command line ("tarn" is put in front). Without
 // strict, missing includes and undefined macros are only warnings (as in the
 // data compiler's flow).
