@@ -130,7 +130,8 @@ TEST_F(ScannerTokens, OperatorsInVocabularyOrder) {
 }
 
 TEST_F(ScannerTokens, InvalidCharactersInPrintableForm) {
-    ScanResult r = scan(std::string("` ' $ \x80 \xff \x01 \x7f ", 14) + std::string(1, '\0') + " ~");
+    static const char bytes[] = "` ' $ \x80 \xff \x01 \x7f \0 ~";
+    ScanResult r = scan(std::string(bytes, sizeof bytes - 1));
     EXPECT_EQ(r.types(), (Types{0, 0, 0, 0, 0, 0, 0, 0, T::TILDE}));
     Strings texts;
     for (size_t i = 0; i + 1 < r.tokens.size(); ++i) texts.push_back(r.tokens[i].text);
