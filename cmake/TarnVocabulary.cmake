@@ -12,23 +12,32 @@
 #       Tn_VerilogTokenTypes, so the parser and the scanner share one enumeration.
 cmake_minimum_required(VERSION 3.18)
 
-# The lines of a file as a list. Tokens such as ";" and "[" mean something
-# to CMake lists, so they are kept encoded until written out (tarn_decode).
+# Tokens such as ";" and "[" mean something to CMake lists, so lines are kept
+# encoded until written out: "@", ";", "[" and "]" (by ASCII code, as they
+# cannot stand in a list themselves) become "@" and a letter.
+set(TARN_ENCODED 64 59 91 93)
+set(TARN_CODES "@A" "@S" "@L" "@R")
+
+# The lines of a file as a list of encoded lines.
 function(tarn_read_lines file out)
   file(READ "${file}" text)
-  string(REPLACE "@" "@A" text "${text}")
-  string(REPLACE ";" "@S" text "${text}")
-  string(REPLACE "[" "@L" text "${text}")
-  string(REPLACE "]" "@R" text "${text}")
+  foreach(i RANGE 3)
+    list(GET TARN_ENCODED ${i} ascii)
+    string(ASCII ${ascii} char)
+    list(GET TARN_CODES ${i} code)
+    string(REPLACE "${char}" "${code}" text "${text}")
+  endforeach()
   string(REPLACE "\n" ";" text "${text}")
   set(${out} "${text}" PARENT_SCOPE)
 endfunction()
 
 function(tarn_decode text out)
-  string(REPLACE "@R" "]" text "${text}")
-  string(REPLACE "@L" "[" text "${text}")
-  string(REPLACE "@S" ";" text "${text}")
-  string(REPLACE "@A" "@" text "${text}")
+  foreach(i RANGE 3 0 -1)
+    list(GET TARN_ENCODED ${i} ascii)
+    string(ASCII ${ascii} char)
+    list(GET TARN_CODES ${i} code)
+    string(REPLACE "${code}" "${char}" text "${text}")
+  endforeach()
   set(${out} "${text}" PARENT_SCOPE)
 endfunction()
 

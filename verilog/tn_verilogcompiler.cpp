@@ -58,8 +58,13 @@ bool Tn_VerilogCompiler::scanSources(const Tn_StringList& args) {
     checkpoint_.reset();
     open(COMPILE, args);
     if (errorsSoFar()) return false;
-    lexer_->startFiles(options_.sourceFiles());
+    startScanner();
     return true;
+}
+
+void Tn_VerilogCompiler::startScanner() {
+    lexer_->startFiles(options_.sourceFiles());
+    filter_->reset();
 }
 
 void Tn_VerilogCompiler::compileFlow() {
@@ -92,7 +97,7 @@ void Tn_VerilogCompiler::elaborateFlow() {
 void Tn_VerilogCompiler::parseSources(Tn_Library& /*work*/, Tn_StringList* /*compiled*/) {
     // Until the parser reads them, the tokens are only scanned: directives,
     // includes and macros take effect and scanner errors are reported.
-    lexer_->startFiles(options_.sourceFiles());
+    startScanner();
     try {
         while (filter_->nextToken()->getType() != antlr::Token::EOF_TYPE) {
         }

@@ -58,6 +58,8 @@ private:
     void elaborateFlow();
     bool errorsSoFar() const { return checkpoint_.errorsIssued(); }
 
+    // The scanner (and the filter over it) started on the source files.
+    void startScanner();
     // Front end: reads every source file into the work library; the names of
     // the units compiled are appended to compiled when given.
     void parseSources(Tn_Library& work, Tn_StringList* compiled);

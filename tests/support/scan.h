@@ -6,6 +6,9 @@
 #include <string>
 #include <vector>
 
+#include <gtest/gtest.h>
+
+#include "tests/support/capturesink.h"
 #include "tests/support/testfiles.h"
 
 struct ScannedToken {
@@ -39,5 +42,28 @@ ScanResult scanArgs(const std::vector<std::string>& args, bool strict = true);
 // Writes source to dir/name and scans it, with further arguments after it.
 ScanResult scanSource(const TempDir& dir, const std::string& source, const std::vector<std::string>& args = {},
                       const std::string& name = "t.v", bool strict = true);
+
+// A fixture scanning sources written into a scratch directory as t.v, with
+// every message captured.
+class ScanTest : public ::testing::Test {
+protected:
+    // The token texts of a scan that must succeed.
+    std::string scanText(const std::string& source, const std::vector<std::string>& args = {}) {
+        ScanResult r = scanSource(dir, source, args);
+        EXPECT_FALSE(r.failed) << r.error;
+        return r.text();
+    }
+    // A scan that must end in a scanner error.
+    ScanResult scanFailing(const std::string& source, const std::vector<std::string>& args = {}) {
+        ScanResult r = scanSource(dir, source, args);
+        EXPECT_TRUE(r.failed) << source;
+        return r;
+    }
+    // The location prefix of messages about line of t.v.
+    std::string loc(int line) const { return "\"" + (dir / "t.v") + "\" line " + std::to_string(line) + " "; }
+
+    TempDir dir;
+    CaptureSink sink;
+};
 
 #endif

@@ -2,27 +2,11 @@
 // unbalanced directives, conditionals spanning files, Verilog-1995 mode.
 #include <gtest/gtest.h>
 
-#include "tests/support/capturesink.h"
 #include "tests/support/scan.h"
 
 namespace {
 
-class Conditionals : public ::testing::Test {
-protected:
-    std::string scanText(const std::string& source, const std::vector<std::string>& args = {}) {
-        ScanResult r = scanSource(dir, source, args);
-        EXPECT_FALSE(r.failed) << r.error;
-        return r.text();
-    }
-    ScanResult scanFailing(const std::string& source, const std::vector<std::string>& args = {}) {
-        ScanResult r = scanSource(dir, source, args);
-        EXPECT_TRUE(r.failed);
-        return r;
-    }
-
-    TempDir dir;
-    CaptureSink sink;
-};
+class Conditionals : public ScanTest {};
 
 const char* const kChain =
     "`ifdef A\n first\n`elsif B\n second\n`else\n third\n`endif\n"

@@ -15,7 +15,7 @@ namespace {
 typedef std::vector<std::string> Strings;
 typedef Tn_VerilogTokenTypes T;
 
-class Directives : public ::testing::Test {
+class Directives : public ScanTest {
 protected:
     // Scans source (with further arguments) and keeps the driver for its state.
     ScanResult run(const std::string& source, std::vector<std::string> args = {}) {
@@ -37,10 +37,7 @@ protected:
         return r.error;
     }
     Tn_VerilogDirectiveState& state() { return driver->lexer().directives(); }
-    std::string loc(int line) const { return "\"" + (dir / "t.v") + "\" line " + std::to_string(line) + " "; }
 
-    TempDir dir;
-    CaptureSink sink;
     std::unique_ptr<Tn_VerilogCompiler> driver;
 };
 

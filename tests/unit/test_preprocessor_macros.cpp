@@ -5,7 +5,6 @@
 
 #include <chrono>
 
-#include "tests/support/capturesink.h"
 #include "tests/support/scan.h"
 #include "verilog/tn_verilogdirectivestate.h"
 #include "verilog/tn_verilogtokentypes.h"
@@ -14,23 +13,7 @@ namespace {
 
 typedef std::vector<std::string> Strings;
 
-class Macros : public ::testing::Test {
-protected:
-    std::string scanText(const std::string& source, const std::vector<std::string>& args = {}) {
-        ScanResult r = scanSource(dir, source, args);
-        EXPECT_FALSE(r.failed) << r.error;
-        return r.text();
-    }
-    ScanResult scanFailing(const std::string& source, const std::vector<std::string>& args = {}) {
-        ScanResult r = scanSource(dir, source, args);
-        EXPECT_TRUE(r.failed);
-        return r;
-    }
-    std::string loc(int line) const { return "\"" + (dir / "t.v") + "\" line " + std::to_string(line) + " "; }
-
-    TempDir dir;
-    CaptureSink sink;
-};
+class Macros : public ScanTest {};
 
 TEST_F(Macros, PlainMacrosExpandAndRescan) {
     EXPECT_EQ(scanText("`define W 8\nreg [`W-1:0] r;"), "reg [ 8 - 1 : 0 ] r ;");

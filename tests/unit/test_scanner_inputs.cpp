@@ -20,11 +20,7 @@ namespace {
 typedef std::vector<std::string> Strings;
 typedef Tn_VerilogTokenTypes T;
 
-class ScannerInputs : public ::testing::Test {
-protected:
-    TempDir dir;
-    CaptureSink sink;
-};
+class ScannerInputs : public ScanTest {};
 
 TEST_F(ScannerInputs, BytesThatAreNotTextBecomeTokensOrStayInside) {
     static const char bytes[] = "a\0b \x80\xff \"s\0\x80\" /* \0\xff */ // \xff\nc";
@@ -95,6 +91,17 @@ TEST_F(ScannerInputs, StatusLinesNameTheLibraryWhenUnitsAreNotElaboratedAtOnce) 
     sink.clear();
     driver.parse({"tarn", a.c_str()});
     EXPECT_EQ(sink.statuses(), (Strings{"Compiling verilog file \"" + a + "\" in library work\n"}));
+}
+
+TEST_F(ScannerInputs, EveryCallOfADriverScansItsSourcesAnew) {
+    const std::string a = dir.write("a.v", "`define A\n");
+    const std::string b = dir.write("b.v", "`ifdef A\n`else\n`else\n`endif\n");
+    Tn_VerilogCompiler driver;
+    EXPECT_EQ(driver.compile({"tarn", b.c_str(), "-top", "x"}), 1);
+    EXPECT_EQ(driver.compile({"tarn", a.c_str(), "-top", "x"}), 0);
+    EXPECT_EQ(driver.compile({"tarn", b.c_str(), "-top", "x"}), 1);
+    EXPECT_EQ(sink.errors().size(), 2u);
+    EXPECT_EQ(driver.sourceFiles().entries().size(), 1u);
 }
 
 TEST_F(ScannerInputs, CompileReportsScannerErrorsAsTheParserWill) {

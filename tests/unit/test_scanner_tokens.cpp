@@ -17,17 +17,13 @@ typedef Tn_VerilogTokenTypes T;
 typedef std::vector<std::string> Strings;
 typedef std::vector<int> Types;
 
-class ScannerTokens : public ::testing::Test {
+class ScannerTokens : public ScanTest {
 protected:
     ScanResult scan(const std::string& source, const std::vector<std::string>& args = {}) {
         ScanResult r = scanSource(dir, source, args);
         EXPECT_FALSE(r.failed) << r.error;
         return r;
     }
-    std::string loc(int line) const { return "\"" + (dir / "t.v") + "\" line " + std::to_string(line) + " "; }
-
-    TempDir dir;
-    CaptureSink sink;
 };
 
 TEST_F(ScannerTokens, KeywordsDependOnTheLanguageMode) {
@@ -201,27 +197,49 @@ TEST(ScannerFilter, MetaCommentsBecomeHiddenTokensOfTheirNeighbours) {
     CaptureSink sink;
     TempDir dir;
     Tn_VerilogCompiler driver;
-    const std::string file = dir.write("t.v", "a // synopsys full_case\n/* synopsys parallel_case */ b c");
+    const std::string file = dir.write("t.v", "// synopsys one\na // synopsys two\n/* synopsys three */ b c");
     ASSERT_TRUE(driver.scanSources({"tarn", file.c_str(), "+pls_client"}));
     Tn_VerilogTokenStreamFilter filter(driver.lexer());
     antlr::RefToken a = filter.nextToken();
     antlr::RefToken b = filter.nextToken();
     antlr::RefToken c = filter.nextToken();
-    EXPECT_EQ(a->getText(), "a");
-    EXPECT_EQ(b->getText(), "b");
-    EXPECT_EQ(c->getText(), "c");
+    EXPECT_EQ(a->getText() + b->getText() + c->getText(), "abc");
+    EXPECT_EQ(filter.nextToken()->getType(), T::EOF_);
     EXPECT_EQ(filter.nextToken()->getType(), T::EOF_);
 
     auto hidden = [](antlr::RefToken t) { return static_cast<antlr::CommonHiddenStreamToken*>(t.get()); };
-    antlr::RefToken first = hidden(a)->getHiddenAfter();
-    ASSERT_TRUE(first);
-    EXPECT_EQ(first->getType(), T::METACOMMENT);
-    EXPECT_EQ(first->getText(), " synopsys full_case");
-    antlr::RefToken second = hidden(first)->getHiddenAfter();
-    ASSERT_TRUE(second);
-    EXPECT_EQ(second->getText(), " synopsys parallel_case ");
-    EXPECT_EQ(hidden(b)->getHiddenBefore().get(), second.get());
+    ASSERT_TRUE(filter.initialHiddenToken());
+    EXPECT_EQ(filter.initialHiddenToken()->getText(), " synopsys one");
+    EXPECT_EQ(hidden(a)->getHiddenBefore().get(), filter.initialHiddenToken().get());
+    antlr::RefToken two = hidden(a)->getHiddenAfter();
+    ASSERT_TRUE(two);
+    EXPECT_EQ(two->getType(), T::METACOMMENT);
+    EXPECT_EQ(two->getText(), " synopsys two");
+    antlr::RefToken three = hidden(two)->getHiddenAfter();
+    ASSERT_TRUE(three);
+    EXPECT_EQ(three->getText(), " synopsys three ");
+    EXPECT_EQ(hidden(three)->getHiddenBefore().get(), two.get());
+    EXPECT_FALSE(hidden(two)->getHiddenBefore());  // hidden tokens do not point at visible ones
+    EXPECT_EQ(hidden(b)->getHiddenBefore().get(), three.get());
     EXPECT_FALSE(hidden(c)->getHiddenBefore());
+}
+
+TEST(ScannerFilter, AScannerErrorComesAfterTheTokensBeforeIt) {
+    CaptureSink sink;
+    TempDir dir;
+    Tn_VerilogCompiler driver;
+    const std::string file = dir.write("t.v", "a b\n`else\n");
+    ASSERT_TRUE(driver.scanSources({"tarn", file.c_str()}));
+    Tn_VerilogTokenStreamFilter filter(driver.lexer());
+    EXPECT_EQ(filter.nextToken()->getText(), "a");
+    EXPECT_EQ(filter.nextToken()->getText(), "b");
+    EXPECT_THROW(filter.nextToken(), antlr::TokenStreamRecognitionException);
+    EXPECT_EQ(filter.nextToken()->getType(), T::EOF_);
+    // Started again, the filter reads the new stream from its beginning.
+    ASSERT_TRUE(driver.scanSources({"tarn", dir.write("u.v", "x").c_str()}));
+    filter.reset();
+    EXPECT_EQ(filter.nextToken()->getText(), "x");
+    EXPECT_EQ(filter.nextToken()->getType(), T::EOF_);
 }
 
 }  // namespace
