@@ -398,9 +398,13 @@ void Tn_VerilogFlexLexer::beginComment(int cond) {
 }
 
 int Tn_VerilogFlexLexer::endComment() {
+    const bool lineComment = condition() == C_LINE_COMMENT;
     popState();
     if (!collectComment_) return 0;
     collectComment_ = false;
+    // The carriage return of a CRLF line is no part of a line comment.
+    if (lineComment && !state_.commentBuffer.empty() && state_.commentBuffer.back() == '\r')
+        state_.commentBuffer.pop_back();
     static const boost::regex pragma("\\s*(synthesis|synopsys|pls|exemplar)\\s+.*");
     static const boost::regex translateOn("\\s*(synthesis|synopsys|exemplar)\\s+translate_on.*");
     static const boost::regex translateOff("\\s*(synthesis|synopsys|exemplar)\\s+translate_off.*");

@@ -7,6 +7,7 @@
 #include "tests/support/scan.h"
 #include "verilog/tn_verilogcompiler.h"
 #include "verilog/tn_verilogdirectivestate.h"
+#include "verilog/tn_verilogflexlexer.h"
 #include "verilog/tn_veriloglexer.h"
 #include "verilog/tn_verilogtokentypes.h"
 
@@ -209,11 +210,24 @@ TEST_F(Directives, RecursiveIncludesAreScannerErrors) {
     EXPECT_EQ(text("`include \"g.vh\"\n`include \"g.vh\"\n", {inc}), "g");
 }
 
+TEST_F(Directives, IncludeNestingIsBounded) {
+    const int depth = Tn_VerilogFlexLexer::kMaxIncludeDepth;
+    for (int i = 0; i <= depth; ++i)
+        dir.write("n" + std::to_string(i) + ".vh", "`include \"n" + std::to_string(i + 1) + ".vh\"\n");
+    dir.write("n" + std::to_string(depth + 1) + ".vh", "deep\n");
+    ScanResult r = run("`include \"n0.vh\"\n", {"+incdir+" + dir.path()});
+    EXPECT_EQ(r.error, "Verilog include files nested more than " + std::to_string(depth) + " deep at '" + dir.path() +
+                           "/n" + std::to_string(depth) + ".vh'");
+    // One level less is fine.
+    dir.write("n" + std::to_string(depth) + ".vh", "deep\n");
+    EXPECT_EQ(text("`include \"n1.vh\"\n", {"+incdir+" + dir.path()}), "deep");
+}
+
 TEST_F(Directives, PragmaCommentsNeedPlsClient) {
     const char* source =
-        "a // synopsys translate_off\n"
+        "a // synopsys translate_off\r\n"
         "b `define HIDDEN\n"
-        "/* synthesis translate_on */ c // synopsys full_case\n"
+        "/* synthesis translate_on */ c // synopsys full_case\r\n"
         "// pls translate_off\n"
         "d // synthesis attribute keep of sig is true\n"
         "// exemplar attribute sig keep true\n"

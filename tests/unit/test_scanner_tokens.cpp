@@ -3,6 +3,8 @@
 // tables, positions, the token objects and the meta-comment filter.
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "tests/support/capturesink.h"
 #include "tests/support/scan.h"
 #include "verilog/tn_verilogcompiler.h"
@@ -42,6 +44,22 @@ TEST_F(ScannerTokens, TheVocabularyIsNumberedAsTheGrammarsExpect) {
     ScanResult r = scan("always if tri xor $setup $nochange");
     EXPECT_EQ(r.types(), (Types{4, 45, 112, 127, 128, 139}));
     EXPECT_EQ(T::METACOMMENT, 222);
+}
+
+// The ANTLR import vocabulary the build writes from the token list.
+TEST(ScannerVocabulary, TheGrammarVocabularyMatchesTheEnumeration) {
+    std::string bin = TARN_BIN;
+    const std::string text = readFile(bin.substr(0, bin.rfind('/')) + "/generated/Tn_VerilogTokenTypes.txt");
+    ASSERT_FALSE(text.empty());
+    EXPECT_EQ(text.find("Tn_Verilog    // output token vocab name\n"), text.find('\n') + 1);
+    for (const char* line :
+         {"K_ALWAYS=\"always\"=4\n", "MINUS_INCDIR=\"-incdir\"=47\n", "S_SETUP=\"$setup\"=128\n",
+          "LBRACKET=\"[\"=157\n", "RBRACKET=\"]\"=180\n", "SEMI=\";\"=184\n", "BASE_SD=\"'sd\"=208\n",
+          "DECIMAL_NUMBER(\"DECIMAL NUMBER\")=214\n", "METACOMMENT(\"METACOMMENT\")=222\n"})
+        EXPECT_NE(text.find(line), std::string::npos) << line;
+    EXPECT_EQ(std::count(text.begin(), text.end(), '\n'), 2 + T::METACOMMENT - 3);
+    static_assert(T::MINUS_INCDIR == 47 && T::SEMI == 184 && T::BASE_SD == 208 && T::DECIMAL_NUMBER == 214,
+                  "the lines above");
 }
 
 TEST_F(ScannerTokens, EscapedAndSystemIdentifiers) {
