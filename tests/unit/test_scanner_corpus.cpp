@@ -1,0 +1,123 @@
+// Real designs and the parser corpus through the scanner: clean sources scan
+// without a message; the faults the scanner is responsible for are reported
+// exactly as the corpus expects.
+#include <gtest/gtest.h>
+
+#include <fstream>
+#include <sstream>
+#include <unistd.h>
+
+#include "tests/support/capturesink.h"
+#include "tests/support/parsercorpus.h"
+#include "tests/support/scan.h"
+
+namespace {
+
+// The shared corpus of real designs scans without a message of any kind.
+TEST(ScannerCorpus, EveryDesignScansCleanly) {
+    const std::string root = std::string(TARN_SHARED_DIR) + "/corpus/designs";
+    std::ifstream manifest(root + "/MANIFEST.tsv");
+    if (!manifest) GTEST_SKIP() << "the shared design corpus is not at " << root;
+    std::string line;
+    std::getline(manifest, line);  // column names
+    int designs = 0;
+    while (std::getline(manifest, line)) {
+        std::vector<std::string> col;
+        std::stringstream cells(line);
+        for (std::string cell; std::getline(cells, cell, '\t');) col.push_back(cell);
+        ASSERT_GE(col.size(), 8u) << line;
+        const std::string base = root + "/" + col[0] + "/";
+        std::vector<std::string> args;
+        std::stringstream files(col[5]), incdirs(col[6]), defines(col[7]);
+        for (std::string f; files >> f;) args.push_back(base + f);
+        for (std::string d; incdirs >> d;) args.push_back("+incdir+" + base + d);
+        for (std::string d; defines >> d;) args.push_back("+define+" + d);
+        CaptureSink sink;
+        ScanResult r = scanArgs(args);
+        EXPECT_FALSE(r.failed) << col[0] << ": " << r.errorFile << ":" << r.errorLine << " " << r.error;
+        EXPECT_EQ(sink.count(PORT_MSG_ERROR) + sink.count(PORT_MSG_WARNING), 0u) << col[0];
+        EXPECT_GT(r.tokens.size(), 1000u) << col[0];
+        ++designs;
+    }
+    EXPECT_GE(designs, 13);
+}
+
+// Texts of the messages that come from the scanner (the rest of the corpus
+// faults belong to the parser).
+bool isScannerMessage(const std::string& m) {
+    static const char* const texts[] = {"Macro reference `",
+                                        "Invalid number of arguments passed to macro reference",
+                                        "Could not find verilog include",
+                                        "Illegal use of `",
+                                        "Illegal `",
+                                        "Attempt to redefine macro",
+                                        "Attempt to undefine macro",
+                                        "redefined",
+                                        "Cannot redefine `",
+                                        "Illegal digit(s)",
+                                        "Invalid `",
+                                        "Verilog-XL specific",
+                                        "End of source reached",
+                                        "Unterminated",
+                                        "is a compiler directive in Verilog-2001",
+                                        "Closing quote missing",
+                                        "reserved word in Verilog-2001"};
+    for (const char* t : texts)
+        if (m.find(t) != std::string::npos) return true;
+    return false;
+}
+
+// Runs from inside the laid-out corpus, as its file names are relative to it.
+class ParserCorpusScan : public ::testing::Test {
+protected:
+    void SetUp() override {
+        materializeParserCorpus(dir);
+        char buf[4096];
+        ASSERT_TRUE(getcwd(buf, sizeof buf));
+        previous = buf;
+        ASSERT_EQ(chdir(dir.path().c_str()), 0);
+    }
+    void TearDown() override { EXPECT_EQ(chdir(previous.c_str()), 0); }
+
+    // The scanner's errors and warnings for a file list, then its error.
+    std::vector<std::string> messages(const CorpusCase& c, const std::vector<std::string>& files) {
+        std::vector<std::string> args = files;
+        for (const std::string& d : c.includeDirs) args.push_back("+incdir+" + d);
+        for (const std::string& d : c.defines) args.push_back("+define+" + d);
+        if (c.mode == "1995") args.push_back("-1995");
+        CaptureSink sink;
+        ScanResult r = scanArgs(args);
+        std::vector<std::string> out;
+        for (const CaptureSink::Message& m : sink.messages)
+            if (m.level != PORT_MSG_STATUS) out.push_back(m.text.substr(0, m.text.size() - 1));
+        if (r.failed) out.push_back("\"" + r.errorFile + "\" line " + std::to_string(r.errorLine) + " " + r.error);
+        return out;
+    }
+
+    TempDir dir;
+    std::string previous;
+};
+
+TEST_F(ParserCorpusScan, CleanCompilationsScanWithoutMessages) {
+    std::string last;
+    for (const CorpusCase& c : readParserCorpus()) {
+        const std::string compilation = c.name.substr(0, c.name.find('/'));
+        if (compilation == last) continue;
+        last = compilation;
+        EXPECT_EQ(messages(c, c.files), std::vector<std::string>{}) << compilation;
+    }
+}
+
+TEST_F(ParserCorpusScan, ScannerFaultsAreReportedAsExpected) {
+    int checked = 0;
+    for (const CorpusCase& c : readParserCorpus()) {
+        bool scanner = !c.faultMessages.empty();
+        for (const std::string& m : c.faultMessages) scanner = scanner && isScannerMessage(m);
+        if (!scanner) continue;
+        EXPECT_EQ(messages(c, c.faultFiles), c.faultMessages) << c.name;
+        ++checked;
+    }
+    EXPECT_GE(checked, 15);
+}
+
+}  // namespace
