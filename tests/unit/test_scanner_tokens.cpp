@@ -92,13 +92,19 @@ TEST_F(ScannerTokens, SizedAndBasedNumbers) {
 }
 
 TEST_F(ScannerTokens, IllegalDigitsAreReportedAndReadAsZero) {
-    ScanResult r = scan("'dx 4'b12 8'o19 'hfg _1 'b_1");
+    ScanResult r = scan("'dxz 4'b12 8'o19 'hfg _1 'b_1");
     EXPECT_EQ(r.text(), "'d 0 4 'b 0 8 'o 0 'h 0 _1 'b 0");
-    EXPECT_EQ(sink.errors(), (Strings{loc(1) + "Illegal digit(s) in decimal constant 'x'\n",
+    EXPECT_EQ(sink.errors(), (Strings{loc(1) + "Illegal digit(s) in decimal constant 'xz'\n",
                                       loc(1) + "Illegal digit(s) in binary constant '12'\n",
                                       loc(1) + "Illegal digit(s) in octal constant '19'\n",
                                       loc(1) + "Illegal digit(s) in hex constant 'fg'\n",
                                       loc(1) + "Illegal digit(s) in binary constant '_1'\n"}));
+}
+
+TEST_F(ScannerTokens, DecimalConstantsMayBeOneUnknownDigit) {
+    ScanResult r = scan("8'dx 4'sdZ 'd? 2'dx__ 'dx1");
+    EXPECT_EQ(r.text(), "8 'd x 4 'sd Z 'd ? 2 'd x 'd 0");
+    EXPECT_EQ(sink.errors(), Strings{loc(1) + "Illegal digit(s) in decimal constant 'x1'\n"});
 }
 
 TEST_F(ScannerTokens, RealsAndTheirNearMisses) {
