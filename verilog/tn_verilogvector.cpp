@@ -893,12 +893,76 @@ Tn_VerilogVector& Tn_VerilogVector::operator=(Tn_VerilogVector&& o) noexcept {
 
 Tn_VerilogVector::~Tn_VerilogVector() { release(); }
 
+namespace {
+
+// Word arrays of wide vectors come from free lists by power-of-two size, so
+// a wide result value costs no allocation beyond the value object once the
+// lists are warm. Small and bounded; off under AddressSanitizer, which must
+// see every allocation.
+#if defined(__SANITIZE_ADDRESS__)
+void* getWords(size_t bytes) { return kor_malloc(bytes); }
+void putWords(void* p, size_t) { kor_free(p); }
+#else
+class WordPool {
+public:
+    WordPool() { alive = true; }
+    ~WordPool() {
+        alive = false;  // vectors that outlive the pool free their words directly
+        for (auto& list : free_)
+            for (void* p : list) kor_free(p);
+    }
+    static bool alive;
+    void* get(size_t bytes) {
+        const size_t c = sizeClass(bytes);
+        if (c < kClasses && !free_[c].empty()) {
+            void* p = free_[c].back();
+            free_[c].pop_back();
+            return p;
+        }
+        return kor_malloc(c < kClasses ? kMinBytes << c : bytes);
+    }
+    void put(void* p, size_t bytes) {
+        const size_t c = sizeClass(bytes);
+        if (c < kClasses && free_[c].size() < kPerClass)
+            free_[c].push_back(p);
+        else
+            kor_free(p);
+    }
+
+private:
+    static const size_t kMinBytes = 32;
+    static const size_t kClasses = 12;   // up to 64 KiB of words
+    static const size_t kPerClass = 64;
+    static size_t sizeClass(size_t bytes) {
+        size_t c = 0;
+        while ((kMinBytes << c) < bytes) ++c;
+        return c;
+    }
+    std::vector<void*> free_[kClasses];
+};
+
+bool WordPool::alive = false;
+WordPool& pool() {
+    static WordPool p;
+    return p;
+}
+void* getWords(size_t bytes) { return pool().get(bytes); }
+void putWords(void* p, size_t bytes) {
+    if (WordPool::alive)
+        pool().put(p, bytes);
+    else
+        kor_free(p);
+}
+#endif
+
+}  // namespace
+
 void Tn_VerilogVector::allocate(uint32_t width) {
     width_ = width == 0 ? 1 : width;
     if (isInline()) {
         inline_[0] = inline_[1] = Limb{0, 0};
     } else {
-        heap_ = static_cast<Limb*>(kor_malloc(size_t(wordsFor(width_)) * sizeof(Limb)));
+        heap_ = static_cast<Limb*>(getWords(size_t(wordsFor(width_)) * sizeof(Limb)));
         if (!heap_) {
             width_ = 1;
             throw std::bad_alloc();
@@ -907,7 +971,7 @@ void Tn_VerilogVector::allocate(uint32_t width) {
 }
 
 void Tn_VerilogVector::release() {
-    if (!isInline()) kor_free(heap_);
+    if (!isInline()) putWords(heap_, size_t(wordsFor(width_)) * sizeof(Limb));
     width_ = 1;
 }
 
