@@ -4,14 +4,8 @@
 #include "src/tn_vcirun.h"
 #include "verilog/tn_verilogcompiler.h"
 
-Tn_VpiPtr Tn_VciCompiler::compile(const ArgList& args) {
-    return Tn_VciRunDriver<Tn_VpiDesign>(&Tn_VerilogCompiler::compile, args);
-}
-
-Tn_VpiPtr Tn_VciCompiler::parse(const ArgList& args) {
-    return Tn_VciRunDriver<Tn_VpiDesign>(&Tn_VerilogCompiler::parse, args);
-}
-
-Tn_VpiPtr Tn_VciCompiler::elaborate(const ArgList& args) {
-    return Tn_VciRunDriver<Tn_VpiDesign>(&Tn_VerilogCompiler::elaborate, args);
+Tn_VpiPtr Tn_VciCompiler::run(Operation op, const ArgList& args) {
+    static int (Tn_VerilogCompiler::*const flows[])(const Tn_StringList&) = {
+        &Tn_VerilogCompiler::compile, &Tn_VerilogCompiler::parse, &Tn_VerilogCompiler::elaborate};
+    return Tn_VciRunDriver<Tn_VpiDesign>(flows[op], args);
 }

@@ -2,16 +2,11 @@
 #ifndef TARN_TN_VCIDATACOMPILER_H
 #define TARN_TN_VCIDATACOMPILER_H
 
-#include "tarn/tn_vci.h"
+#include "src/tn_vcibase.h"
 
-class Tn_VciDataCompiler : public Tn_Vci {
-public:
-    Tn_VpiPtr compile(const ArgList& args) override;
-    Tn_VpiPtr compile(int argc, const char* const* argv) override { return compile(argList(argc, argv)); }
-    Tn_VpiPtr parse(const ArgList& args) override;
-    Tn_VpiPtr parse(int argc, const char* const* argv) override { return parse(argList(argc, argv)); }
-    Tn_VpiPtr elaborate(const ArgList& args) override;
-    Tn_VpiPtr elaborate(int argc, const char* const* argv) override { return elaborate(argList(argc, argv)); }
+class Tn_VciDataCompiler : public Tn_VciBase {
+protected:
+    Tn_VpiPtr run(Operation op, const ArgList& args) override;
 };
 
 #endif

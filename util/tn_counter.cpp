@@ -11,21 +11,12 @@ Tn_CounterPtr Tn_Counter::createPair(const Tn_CounterPtr& outer, const Tn_Counte
     return Tn_CounterPtr(new Tn_PairCounter(outer, inner));
 }
 
-bool Tn_UpCounter::next() {
-    if (current_ >= last_) {
+bool Tn_RangeCounter::step(int32_t direction) {
+    if (direction > 0 ? current_ >= last_ : current_ <= last_) {
         current_ = first_;
         return false;
     }
-    ++current_;
-    return true;
-}
-
-bool Tn_DownCounter::next() {
-    if (current_ <= last_) {
-        current_ = first_;
-        return false;
-    }
-    --current_;
+    current_ += direction;
     return true;
 }
 

@@ -25,24 +25,30 @@ public:
     static Tn_CounterPtr createPair(const Tn_CounterPtr& outer, const Tn_CounterPtr& inner);
 };
 
-class Tn_UpCounter : public Tn_Counter {
+// A counter over one range [first, last]; subclasses step it.
+class Tn_RangeCounter : public Tn_Counter {
 public:
-    Tn_UpCounter(int32_t first, int32_t last) : current_(first), first_(first), last_(last) {}
-    bool next() override;
     std::vector<int32_t> values() const override { return {current_}; }
+
+protected:
+    Tn_RangeCounter(int32_t first, int32_t last) : current_(first), first_(first), last_(last) {}
+    // Moves current one step towards last; at last, back to first and false.
+    bool step(int32_t direction);
 
 private:
     int32_t current_, first_, last_;
 };
 
-class Tn_DownCounter : public Tn_Counter {
+class Tn_UpCounter : public Tn_RangeCounter {
 public:
-    Tn_DownCounter(int32_t first, int32_t last) : current_(first), first_(first), last_(last) {}
-    bool next() override;
-    std::vector<int32_t> values() const override { return {current_}; }
+    Tn_UpCounter(int32_t first, int32_t last) : Tn_RangeCounter(first, last) {}
+    bool next() override { return step(1); }
+};
 
-private:
-    int32_t current_, first_, last_;
+class Tn_DownCounter : public Tn_RangeCounter {
+public:
+    Tn_DownCounter(int32_t first, int32_t last) : Tn_RangeCounter(first, last) {}
+    bool next() override { return step(-1); }
 };
 
 class Tn_PairCounter : public Tn_Counter {
