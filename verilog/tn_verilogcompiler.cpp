@@ -151,6 +151,7 @@ Tn_StringList Tn_VerilogCompiler::findTopUnits(Tn_Library& work, bool recursive)
 void Tn_VerilogCompiler::elaborateTops(const Tn_StringList& tops, bool /*recursive*/) {
     std::unique_ptr<Tn_VerilogDesign> design = buildDesign(tops);
     // Elaboration of the container replaces result_ here.
+    if (result_ && options_.hasPlusArg("tarn+memoryreport")) result_->memoryReport();
     if (errorsSoFar()) result_.reset();
 }
 
