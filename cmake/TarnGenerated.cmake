@@ -56,3 +56,4 @@ function(tarn_antlr_grammar)
 endfunction()
 
 # The grammars (tarn_antlr_grammar calls) go here.
+tarn_antlr_grammar(GRAMMAR verilog/tn_veriloggrammar.g CLASSES Tn_VerilogGrammar)

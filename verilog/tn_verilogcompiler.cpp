@@ -12,12 +12,14 @@
 #include "verilog/tn_verilognodes.h"
 #include "verilog/tn_verilogdirectivestate.h"
 #include "verilog/tn_veriloglexer.h"
+#include "verilog/tn_verilogparser.h"
 #include "verilog/tn_verilogtokenstreamfilter.h"
 
 Tn_VerilogCompiler::Tn_VerilogCompiler()
     : directives_(new Tn_VerilogDirectiveState()),
       lexer_(new Tn_VerilogLexer(options_, *directives_)),
-      filter_(new Tn_VerilogTokenStreamFilter(*lexer_)) {}
+      filter_(new Tn_VerilogTokenStreamFilter(*lexer_)),
+      parser_(new Tn_VerilogParser(options_, *directives_, *filter_)) {}
 
 Tn_VerilogCompiler::~Tn_VerilogCompiler() {}
 
@@ -94,16 +96,8 @@ void Tn_VerilogCompiler::elaborateFlow() {
     if (!errorsSoFar()) elaborateTops(tops, options_.recursive());
 }
 
-void Tn_VerilogCompiler::parseSources(Tn_Library& /*work*/, Tn_StringList* /*compiled*/) {
-    // Until the parser reads them, the tokens are only scanned: directives,
-    // includes and macros take effect and scanner errors are reported.
-    startScanner();
-    try {
-        while (filter_->nextToken()->getType() != antlr::Token::EOF_TYPE) {
-        }
-    } catch (const antlr::TokenStreamRecognitionException& e) {
-        Tn_VerilogLexer::report(e);
-    }
+void Tn_VerilogCompiler::parseSources(Tn_Library& work, Tn_StringList* compiled) {
+    parser_->parse(options_.sourceFiles(), work, compiled);
 }
 
 Tn_StringList Tn_VerilogCompiler::topUnits(Tn_Library& work) {
@@ -181,8 +175,18 @@ void Tn_VerilogCompiler::applyOverrides(Tn_VerilogDesign& design, Tn_VerilogModu
             TN_MSG().issueError("-G parameter assignments must either be all named or all ordered\n");
             return;
         }
-        // The parser turns the value text into the assignment's expression.
+        Tn_VerilogExpression* value = nullptr;
+        try {
+            value = Tn_VerilogParser::parseExpression(o.second, design.factory(), options_, directives_.get());
+        } catch (const Tn_VerilogExpressionSyntaxError&) {
+            if (named)
+                TN_MSG().issueError("Invalid value '%s' specified for parameter '%s'\n", o.second.c_str(), o.first.c_str());
+            else
+                TN_MSG().issueError("Invalid value '%s' specified for parameter\n", o.second.c_str());
+            continue;
+        }
         Tn_VerilogParamAssignment* a = design.factory().createParamAssignment();
+        a->Value = value;
         a->Name = o.first;
         a->NamedParamAssignmentFlag = named;
         a->CmdLineParamAssignmentFlag = true;

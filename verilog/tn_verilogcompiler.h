@@ -14,6 +14,7 @@ class Tn_VerilogDesign;
 class Tn_VerilogModuleInstance;
 class Tn_VerilogDirectiveState;
 class Tn_VerilogLexer;
+class Tn_VerilogParser;
 class Tn_VerilogTokenStreamFilter;
 
 class Tn_VerilogCompiler {
@@ -75,6 +76,7 @@ private:
     std::unique_ptr<Tn_VerilogDirectiveState> directives_;
     std::unique_ptr<Tn_VerilogLexer> lexer_;
     std::unique_ptr<Tn_VerilogTokenStreamFilter> filter_;
+    std::unique_ptr<Tn_VerilogParser> parser_;
     std::unique_ptr<Tn_VerilogDesign> result_;
     Tn_MessageCheckpoint checkpoint_;
 };

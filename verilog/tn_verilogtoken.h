@@ -18,6 +18,9 @@ public:
     void setFilename(const std::string& file) override;
     // ["text",<type>,<file>,<line>,<column>]
     std::string toString() const override;
+    // The text and the file without copies (the parser interns them).
+    const std::string& textRef() const { return text; }
+    const Tn_RCStringPtr& fileRef() const { return file_; }
 
     // Storage pooling: freed tokens go to a free list that new tokens use first.
     static void* operator new(std::size_t size);

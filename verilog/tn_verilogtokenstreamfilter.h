@@ -28,6 +28,7 @@ public:
     antlr::RefToken initialHiddenToken() const { return firstHidden_; }
     // Forgets the stream read so far; for a lexer that was started again.
     void reset();
+    Tn_VerilogLexer& lexer() const { return lexer_; }
 
 private:
     void readNext();

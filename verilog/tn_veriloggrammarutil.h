@@ -1,0 +1,325 @@
+// What the generated grammar (Tn_VerilogGrammar) needs besides its rules:
+// the construction hooks it calls (implemented by Tn_VerilogParser), the
+// small records that carry a declaration or an instantiation across several
+// hooks, the depth guard of the recursive rules and token classifications.
+#ifndef TARN_TN_VERILOGGRAMMARUTIL_H
+#define TARN_TN_VERILOGGRAMMARUTIL_H
+
+#include <antlr/Token.hpp>
+#include <antlr/TokenRefCount.hpp>
+#include <cstddef>
+
+class Tn_VerilogNode;
+class Tn_VerilogExpression;
+class Tn_VerilogEventExpression;
+class Tn_VerilogStatement;
+class Tn_VerilogGenerateStatement;
+class Tn_VerilogAttributes;
+class Tn_VerilogRange;
+class Tn_VerilogDelay;
+class Tn_VerilogDriveStrength;
+class Tn_VerilogTypeDef;
+
+typedef antlr::RefToken TokenRef;
+
+// A declaration being read: the type part written once, shared by every name
+// declared with it (the type definition node is made for the first name).
+struct Tn_VerilogDeclSpec {
+    enum Kind { NONE, NET, REG, INTEGER, TIME, REAL, REALTIME, EVENT };
+    TokenRef first;                            // where the declaration starts
+    Tn_VerilogAttributes* attributes = nullptr;
+    int direction = 0;                         // K_INPUT, K_OUTPUT, K_INOUT or 0
+    int kind = NONE;
+    int netType = 0;                           // the net keyword's token type
+    bool isSigned = false;
+    bool ansi = false;                         // a port declaration in a module header
+    int grouping = -1;                         // 0 vectored, 1 scalared
+    int chargeStrength = -1;                   // 0 small, 1 medium, 2 large
+    Tn_VerilogDriveStrength* strength = nullptr;
+    Tn_VerilogRange* range = nullptr;
+    Tn_VerilogDelay* delay = nullptr;
+    Tn_VerilogTypeDef* typeDef = nullptr;
+    int count = 0;                             // names declared so far
+};
+
+// A parameter, localparam or specparam declaration being read.
+struct Tn_VerilogParamSpec {
+    TokenRef first;
+    Tn_VerilogAttributes* attributes = nullptr;
+    bool local = false;
+    bool specparam = false;
+    int type = 0;                              // Tn_VerilogDeclSpec kind of integer/real/realtime/time, or 0
+    bool isSigned = false;
+    Tn_VerilogRange* range = nullptr;
+};
+
+// A gate or module instantiation being read (one statement, any number of
+// instances).
+struct Tn_VerilogInstSpec {
+    TokenRef first;                            // gate keyword or definition name
+    Tn_VerilogAttributes* attributes = nullptr;
+    int gateType = 0;                          // gate keyword's token type
+    Tn_VerilogDriveStrength* strength = nullptr;
+    Tn_VerilogDelay* delay = nullptr;
+    size_t paramsBegin = 0;                    // parameter values: a range of the parser's list
+    bool hasParameters = false;
+    int count = 0;                             // instances made so far
+};
+
+class Tn_VerilogGrammarUtil {
+public:
+    // Depth of nested constructs at which parsing stops with an error: far
+    // beyond real code, and far within the stack of the recursive rules.
+    static const int kMaxNesting = 1000;
+
+    virtual ~Tn_VerilogGrammarUtil();
+
+    // Token classes used by the grammar's lookahead decisions.
+    static bool isStrength(int type);
+    static bool isChargeStrength(int type);
+    static bool isAnsiPortStart(int type);
+    static bool isBlockDeclaration(int type, bool ports);
+    static bool isPulseControlName(const TokenRef& id);
+    static unsigned edgeDescriptorBit(int type);
+
+protected:
+    // Counts one level of a recursive rule for the lifetime of the rule.
+    class Nest {
+    public:
+        explicit Nest(Tn_VerilogGrammarUtil& g) : g_(g) {
+            if (++g_.nesting_ > kMaxNesting) g_.nestingExceeded();
+        }
+        ~Nest() { --g_.nesting_; }
+        Nest(const Nest&) = delete;
+        Nest& operator=(const Nest&) = delete;
+
+    private:
+        Tn_VerilogGrammarUtil& g_;
+    };
+    // Marks an expression that must be constant (its function calls are
+    // constant function calls).
+    class ConstantContext {
+    public:
+        explicit ConstantContext(Tn_VerilogGrammarUtil& g) : g_(g) { ++g_.constant_; }
+        ~ConstantContext() { --g_.constant_; }
+        ConstantContext(const ConstantContext&) = delete;
+        ConstantContext& operator=(const ConstantContext&) = delete;
+
+    private:
+        Tn_VerilogGrammarUtil& g_;
+    };
+
+    bool v2001() const { return verilog2001_; }
+    bool inConstantExpression() const { return constant_ > 0; }
+    // Throws: the nesting went beyond kMaxNesting.
+    virtual void nestingExceeded() = 0;
+    // Whether a declaration (after any attribute instances) comes next.
+    virtual bool declarationAhead(bool ports) = 0;
+
+    // Design units.
+    virtual void skipConfiguration(const TokenRef& config) = 0;
+    virtual void beginModule(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a) = 0;
+    virtual void endModule(const TokenRef& end) = 0;
+    virtual void modulePort(const TokenRef& where, const TokenRef& name, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogExpression* portReferenceName(const TokenRef& id) = 0;
+    virtual void udpBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a) = 0;
+    virtual void udpPort(const TokenRef& id) = 0;
+    virtual void udpInitialStatement(const TokenRef& keyword, const TokenRef& id, Tn_VerilogExpression* e) = 0;
+    virtual void udpTableBegin(const TokenRef& table) = 0;
+    virtual bool udpSequential() = 0;
+    virtual void udpRowBegin(const TokenRef& first) = 0;
+    virtual void udpRowSymbol(const TokenRef& symbol) = 0;
+    virtual void udpRowEdgeOpen(const TokenRef& paren) = 0;
+    virtual void udpRowEdgeClose(const TokenRef& paren) = 0;
+    virtual void udpRowColon(const TokenRef& colon) = 0;
+    virtual void udpRowEnd(const TokenRef& semi) = 0;
+    virtual void udpEnd(const TokenRef& end) = 0;
+
+    // Attributes.
+    virtual Tn_VerilogAttributes* attributesBegin(const TokenRef& open) = 0;
+    virtual void attributeAdd(Tn_VerilogAttributes* a, const TokenRef& id, Tn_VerilogExpression* e) = 0;
+
+    // Declarations. Unpacked dimensions are collected between
+    // dimensionsBegin() and the declaration that takes them.
+    virtual void declarePort(Tn_VerilogDeclSpec& s, const TokenRef& id, Tn_VerilogExpression* init) = 0;
+    virtual size_t dimensionsBegin() = 0;
+    virtual void dimensionAdd(Tn_VerilogRange* r) = 0;
+    virtual void declareNet(Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims, Tn_VerilogExpression* e) = 0;
+    virtual void declareVariable(Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims, Tn_VerilogExpression* e) = 0;
+    virtual void declareGenvar(const TokenRef& id, Tn_VerilogAttributes* a) = 0;
+    virtual void declareParameter(Tn_VerilogParamSpec& s, const TokenRef& id, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogExpression* pulseLimits(const TokenRef& paren, Tn_VerilogExpression* reject,
+                                              Tn_VerilogExpression* error) = 0;
+    virtual void defparam(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
+                          Tn_VerilogExpression* value) = 0;
+    virtual Tn_VerilogDriveStrength* driveStrengthBegin(const TokenRef& paren) = 0;
+    virtual void driveStrengthAdd(Tn_VerilogDriveStrength* s, int keyword) = 0;
+    virtual Tn_VerilogRange* makeRange(const TokenRef& bracket, Tn_VerilogExpression* msb, Tn_VerilogExpression* lsb) = 0;
+    virtual Tn_VerilogDelay* delayBegin(const TokenRef& hash) = 0;
+    virtual void delayAdd(Tn_VerilogDelay* d, Tn_VerilogExpression* e) = 0;
+
+    // Module items.
+    virtual void contAssign(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s,
+                            Tn_VerilogDelay* d, Tn_VerilogExpression* target, Tn_VerilogExpression* source) = 0;
+    virtual Tn_VerilogNode* gateBegin(Tn_VerilogInstSpec& s, const TokenRef& id, Tn_VerilogRange* r,
+                                      const TokenRef& paren) = 0;
+    virtual void gateTerminal(Tn_VerilogNode* gate, Tn_VerilogExpression* e) = 0;
+    virtual void gateEnd(Tn_VerilogInstSpec& s, Tn_VerilogNode* gate) = 0;
+    virtual size_t parameterValuesBegin() = 0;
+    virtual void paramValue(Tn_VerilogInstSpec& s, const TokenRef& name, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogNode* instanceBegin(Tn_VerilogInstSpec& s, const TokenRef& id, Tn_VerilogRange* r,
+                                          const TokenRef& paren) = 0;
+    virtual void connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a, const TokenRef& where,
+                            const TokenRef& name, Tn_VerilogExpression* e) = 0;
+    virtual void instantiationEnd(Tn_VerilogInstSpec& s) = 0;
+    virtual void process(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) = 0;
+    virtual void taskBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a, bool automatic) = 0;
+    virtual void taskEnd(const TokenRef& end) = 0;
+    virtual void functionBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a, bool automatic,
+                               Tn_VerilogDeclSpec& result) = 0;
+    virtual void functionEnd(const TokenRef& end) = 0;
+    virtual void procedureBody(Tn_VerilogStatement* s) = 0;
+
+    // Generate constructs.
+    virtual void generateRegionBegin(const TokenRef& keyword) = 0;
+    virtual void generateRegionEnd() = 0;
+    virtual void addGenerateStatement(Tn_VerilogGenerateStatement* g) = 0;
+    virtual Tn_VerilogGenerateStatement* generateBlockBegin(const TokenRef& first, const TokenRef& name) = 0;
+    virtual void generateBlockEnd(Tn_VerilogGenerateStatement* g) = 0;
+    virtual Tn_VerilogGenerateStatement* generateForBegin(const TokenRef& keyword, const TokenRef& genvar,
+                                                          const TokenRef& id, Tn_VerilogExpression* init,
+                                                          Tn_VerilogExpression* condition, const TokenRef& id2,
+                                                          Tn_VerilogExpression* step) = 0;
+    virtual void generateLoopBodyBegin(Tn_VerilogGenerateStatement* g, const TokenRef& first, const TokenRef& name) = 0;
+    virtual void generateLoopBodyEnd(Tn_VerilogGenerateStatement* g) = 0;
+    virtual Tn_VerilogGenerateStatement* makeGenerateIf(const TokenRef& keyword, Tn_VerilogExpression* c) = 0;
+    virtual void generateIfBranch(Tn_VerilogGenerateStatement* g, Tn_VerilogGenerateStatement* branch, bool then) = 0;
+    virtual Tn_VerilogGenerateStatement* makeGenerateCase(const TokenRef& keyword, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogGenerateStatement* generateCaseItemBegin(Tn_VerilogGenerateStatement* g,
+                                                               const TokenRef& first) = 0;
+    virtual void generateCaseItemExpression(Tn_VerilogGenerateStatement* item, Tn_VerilogExpression* e) = 0;
+    virtual void generateCaseItemBody(Tn_VerilogGenerateStatement* item, Tn_VerilogGenerateStatement* body) = 0;
+
+    // Specify blocks.
+    virtual Tn_VerilogNode* pulseControlBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) = 0;
+    virtual void pulseControlOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogNode* pathBegin(const TokenRef& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* condition,
+                                      bool ifnone) = 0;
+    virtual void pathEdge(Tn_VerilogNode* p, int edge) = 0;
+    virtual void pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
+    virtual void pathPolarity(Tn_VerilogNode* p, int sign, bool data) = 0;
+    virtual void pathType(Tn_VerilogNode* p, int type) = 0;
+    virtual void pathOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
+    virtual void pathData(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
+    virtual void pathDelay(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
+    virtual void pathEnd(Tn_VerilogNode* p, const TokenRef& semi) = 0;
+    virtual Tn_VerilogNode* timingCheckBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) = 0;
+    virtual void timingCheckArg(Tn_VerilogNode* c, const TokenRef& where, int edge, unsigned descriptors,
+                                Tn_VerilogExpression* e, Tn_VerilogExpression* condition) = 0;
+    virtual void timingCheckEnd(Tn_VerilogNode* c, const TokenRef& paren) = 0;
+    virtual void ignoreSpecifyTask(const TokenRef& id) = 0;
+
+    // Statements.
+    virtual Tn_VerilogStatement* nullStatement(const TokenRef& semi, Tn_VerilogAttributes* a) = 0;
+    virtual Tn_VerilogStatement* blockingAssign(const TokenRef& first, Tn_VerilogAttributes* a,
+                                                Tn_VerilogExpression* target, Tn_VerilogStatement* control,
+                                                Tn_VerilogExpression* source) = 0;
+    virtual Tn_VerilogStatement* nonBlockingAssign(const TokenRef& first, Tn_VerilogAttributes* a,
+                                                   Tn_VerilogExpression* target, Tn_VerilogStatement* control,
+                                                   Tn_VerilogExpression* source) = 0;
+    virtual Tn_VerilogStatement* taskCall(const TokenRef& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* name) = 0;
+    virtual void callArgument(Tn_VerilogNode* call, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogExpression* systemCall(const TokenRef& id) = 0;
+    virtual void systemArgument(Tn_VerilogExpression* call, Tn_VerilogExpression* e, const TokenRef& where) = 0;
+    virtual Tn_VerilogStatement* systemTask(const TokenRef& id, Tn_VerilogAttributes* a, Tn_VerilogExpression* call) = 0;
+    virtual Tn_VerilogStatement* delayControl(const TokenRef& hash, Tn_VerilogAttributes* a, Tn_VerilogExpression* d,
+                                              Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* repeatControl(const TokenRef& keyword, Tn_VerilogExpression* count,
+                                               Tn_VerilogStatement* eventControl) = 0;
+    virtual Tn_VerilogStatement* makeEventControl(const TokenRef& at, Tn_VerilogAttributes* a,
+                                                  Tn_VerilogEventExpression* e) = 0;
+    virtual Tn_VerilogStatement* emptyEventControl(const TokenRef& at, Tn_VerilogAttributes* a,
+                                                   const TokenRef& paren) = 0;
+    virtual void eventControlBody(Tn_VerilogStatement* control, Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogEventExpression* eventOr(Tn_VerilogEventExpression* first) = 0;
+    virtual void eventOrAdd(Tn_VerilogEventExpression* o, Tn_VerilogEventExpression* e) = 0;
+    virtual Tn_VerilogEventExpression* edgeEvent(const TokenRef& keyword, Tn_VerilogExpression* e) = 0;
+    virtual size_t ifChainBegin() = 0;
+    virtual void ifChainAdd(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
+                            Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* ifChainEnd(size_t mark, Tn_VerilogStatement* otherwise) = 0;
+    virtual Tn_VerilogStatement* caseBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) = 0;
+    virtual void caseSelector(Tn_VerilogStatement* c, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogStatement* caseItemBegin(Tn_VerilogStatement* c, const TokenRef& first) = 0;
+    virtual void caseItemExpression(Tn_VerilogStatement* item, Tn_VerilogExpression* e) = 0;
+    virtual void caseItemBody(Tn_VerilogStatement* item, Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* forever(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* repeat(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
+                                        Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* whileLoop(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
+                                           Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* forLoop(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* init,
+                                         Tn_VerilogExpression* c, Tn_VerilogStatement* step, Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* blockBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) = 0;
+    virtual Tn_VerilogStatement* blockName(Tn_VerilogStatement* b, const TokenRef& id) = 0;
+    virtual void blockAdd(Tn_VerilogStatement* b, Tn_VerilogStatement* s) = 0;
+    virtual void blockEnd(Tn_VerilogStatement* b) = 0;
+    virtual Tn_VerilogStatement* makeWait(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
+                                          Tn_VerilogStatement* s) = 0;
+    virtual Tn_VerilogStatement* disable(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* n) = 0;
+    virtual Tn_VerilogStatement* makeEventTrigger(const TokenRef& arrow, Tn_VerilogAttributes* a,
+                                                  Tn_VerilogExpression* n) = 0;
+    virtual Tn_VerilogStatement* proceduralAssign(const TokenRef& keyword, Tn_VerilogAttributes* a,
+                                                  Tn_VerilogExpression* target, Tn_VerilogExpression* source) = 0;
+    virtual Tn_VerilogStatement* proceduralRelease(const TokenRef& keyword, Tn_VerilogAttributes* a,
+                                                   Tn_VerilogExpression* target) = 0;
+
+    // Expressions.
+    virtual size_t conditionalBegin() = 0;
+    virtual void conditionalAdd(const TokenRef& question, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
+                                Tn_VerilogExpression* t) = 0;
+    virtual Tn_VerilogExpression* conditionalEnd(size_t mark, Tn_VerilogExpression* last) = 0;
+    virtual size_t binaryBegin() = 0;
+    virtual void binaryOperand(Tn_VerilogExpression* e) = 0;
+    virtual void binaryOperator(const TokenRef& op, Tn_VerilogAttributes* a) = 0;
+    virtual Tn_VerilogExpression* binaryEnd(size_t mark, Tn_VerilogExpression* last) = 0;
+    virtual size_t unaryBegin() = 0;
+    virtual void unaryOperator(const TokenRef& op, Tn_VerilogAttributes* a) = 0;
+    virtual Tn_VerilogExpression* unaryEnd(size_t mark, Tn_VerilogExpression* operand) = 0;
+    virtual Tn_VerilogExpression* minTypMax(const TokenRef& colon, Tn_VerilogExpression* min, Tn_VerilogExpression* typ,
+                                            Tn_VerilogExpression* max) = 0;
+    virtual Tn_VerilogExpression* makeConcatenation(const TokenRef& brace, Tn_VerilogExpression* first) = 0;
+    virtual Tn_VerilogExpression* multipleConcatenation(const TokenRef& brace, Tn_VerilogExpression* count) = 0;
+    virtual void concatenationAdd(Tn_VerilogExpression* c, Tn_VerilogExpression* e) = 0;
+    virtual Tn_VerilogExpression* functionCall(const TokenRef& paren, Tn_VerilogAttributes* a,
+                                               Tn_VerilogExpression* name) = 0;
+    virtual size_t nameBegin() = 0;
+    virtual void nameComponent(const TokenRef& id) = 0;
+    virtual void nameSelect(const TokenRef& bracket, int kind, Tn_VerilogExpression* e1, Tn_VerilogExpression* e2) = 0;
+    virtual Tn_VerilogExpression* nameEnd(size_t mark) = 0;
+    virtual Tn_VerilogExpression* simpleName(const TokenRef& id) = 0;
+    virtual Tn_VerilogExpression* bitSelect(const TokenRef& bracket, Tn_VerilogExpression* operand,
+                                            Tn_VerilogExpression* index) = 0;
+    virtual Tn_VerilogExpression* partSelect(const TokenRef& bracket, Tn_VerilogExpression* operand,
+                                             Tn_VerilogExpression* msb, Tn_VerilogExpression* lsb) = 0;
+    virtual Tn_VerilogExpression* stringConstant(const TokenRef& s) = 0;
+    virtual Tn_VerilogExpression* integerConstant(const TokenRef& digits) = 0;
+    virtual Tn_VerilogExpression* realConstant(const TokenRef& r) = 0;
+    virtual Tn_VerilogExpression* basedConstant(const TokenRef& size, const TokenRef& base, const TokenRef& digits) = 0;
+
+    bool verilog2001_ = true;
+
+private:
+    int nesting_ = 0;
+    int constant_ = 0;
+    friend class Nest;
+    friend class ConstantContext;
+
+protected:
+    void resetNesting() {
+        nesting_ = 0;
+        constant_ = 0;
+    }
+};
+
+#endif
