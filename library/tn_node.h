@@ -3,6 +3,7 @@
 #ifndef TARN_TN_NODE_H
 #define TARN_TN_NODE_H
 
+#include <cstddef>
 #include <cstdint>
 
 #include "util/tn_symbol.h"
@@ -44,6 +45,12 @@ public:
     void mark() { mark_ = s_generation; }
     bool isMarked() const { return mark_ == s_generation; }
     static void nextGeneration() { ++s_generation; }
+
+    // Node storage: units make millions of small nodes, so they come from
+    // per-size free lists carved out of large blocks (process-wide, reused
+    // when nodes are destroyed, like the scanner's token pool).
+    static void* operator new(std::size_t size);
+    static void operator delete(void* p, std::size_t size);
 
 protected:
     Tn_Node() : id_(0), mark_(-1) {}

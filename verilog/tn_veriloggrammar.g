@@ -25,10 +25,33 @@ options {
     classHeaderSuffix = "public Tn_VerilogGrammarUtil";
 }
 
+{
+public:
+    // Lookahead from the ring of Tn_VerilogGrammarUtil; final, so that the
+    // rules call it directly.
+    int LA(unsigned int i) override final {
+        if (i > ahead_.count) fillLookahead(i);
+        return ahead_.at(i).type;
+    }
+    ANTLR_USE_NAMESPACE(antlr)RefToken LT(unsigned int i) override final { return lookaheadToken(i); }
+    void consume() override final { dropToken(); }
+    void match(int t) override final {
+        if (LA(1) != t)
+            throw ANTLR_USE_NAMESPACE(antlr)MismatchedTokenException(getTokenNames(), getNumTokens(), LT(1), t, false,
+                                                                       getFilename());
+        dropToken();
+    }
+}
+
 // ------------------------------------------------------------ source text
 
 sourceText
     : ( description )* EOF
+    ;
+
+// A text that is one expression (a -G value).
+singleExpression returns [Tn_VerilogExpression* e = 0]
+    : e=expression EOF
     ;
 
 description

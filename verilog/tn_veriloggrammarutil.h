@@ -8,6 +8,10 @@
 #include <antlr/Token.hpp>
 #include <antlr/TokenRefCount.hpp>
 #include <cstddef>
+#include <string>
+#include <vector>
+
+#include "util/tn_rcstring.h"
 
 class Tn_VerilogNode;
 class Tn_VerilogExpression;
@@ -83,6 +87,36 @@ public:
     static unsigned edgeDescriptorBit(int type);
 
 protected:
+    // The tokens ahead, straight from the scanner: a ring of slots holding
+    // type, text and place. The grammar needs a token object only for the
+    // tokens it keeps (names, numbers), so the others never get one.
+    struct Slot {
+        int type = 0;
+        bool hasText = false;
+        std::string text;
+        Tn_RCStringPtr file;
+        int line = 0;
+        int column = 0;
+        TokenRef token;
+    };
+    struct Lookahead {
+        std::vector<Slot> slots;
+        unsigned int head = 0, count = 0, mask = 0;
+        Slot& at(unsigned int i) { return slots[(head + i - 1) & mask]; }
+    };
+    Lookahead ahead_;
+    // Reads tokens until i are ahead.
+    virtual void fillLookahead(unsigned int i) = 0;
+    // The token object of the i-th token ahead (made when first asked for).
+    TokenRef lookaheadToken(unsigned int i);
+    void dropToken() {
+        if (ahead_.count == 0) fillLookahead(1);
+        ahead_.slots[ahead_.head].token = TokenRef();
+        ahead_.head = (ahead_.head + 1) & ahead_.mask;
+        --ahead_.count;
+    }
+    void clearLookahead();
+
     // Counts one level of a recursive rule for the lifetime of the rule.
     class Nest {
     public:

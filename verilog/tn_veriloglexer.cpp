@@ -13,14 +13,17 @@ void Tn_VerilogLexer::startFiles(const Tn_StringList& files) { scanner_.startFil
 
 void Tn_VerilogLexer::startString(const Port_String& text) { scanner_.startString(text); }
 
-antlr::RefToken Tn_VerilogLexer::nextToken() {
-    int type;
+int Tn_VerilogLexer::nextType() {
     try {
-        type = scanner_.scan();
+        return scanner_.scan();
     } catch (Tn_VerilogFlexException& e) {
         scanner_.resetInput();
         throw antlr::TokenStreamRecognitionException(e);
     }
+}
+
+antlr::RefToken Tn_VerilogLexer::nextToken() {
+    const int type = nextType();
     Tn_VerilogScannerState& s = scanner_.state();
     return antlr::RefToken(new Tn_VerilogToken(type, s.text, s.file, s.line, s.column));
 }

@@ -25,6 +25,9 @@ public:
     void setAnnounceLibrary(bool announce) { scanner_.state().announceLibrary = announce; }
 
     antlr::RefToken nextToken() override;
+    // The next token's type only: its text, file, line and column are left
+    // in state() (the parser makes token objects for the few it keeps).
+    int nextType();
 
     Tn_VerilogScannerState& state() { return scanner_.state(); }
     const Tn_VerilogFileList& fileList() const { return scanner_.state().fileList; }

@@ -24,6 +24,21 @@ namespace V = Tn_Verilog;
 
 namespace {
 
+// Tokens whose text is their own: every other token's text is fixed.
+bool ownText(int type) {
+    typedef Tn_VerilogTokenTypes T;
+    return type >= T::INTEGER || type == 0 || (type >= T::BASE_D && type <= T::BASE_SH);
+}
+
+const char* fixedText(int type) {
+    static const char* const texts[] = {"", "EOF", "", "",
+#define TN_TOKEN(name, text, kind) text,
+#include "verilog/tn_verilogtokens.def"
+#undef TN_TOKEN
+    };
+    return type >= 0 && type < static_cast<int>(sizeof texts / sizeof texts[0]) ? texts[type] : "";
+}
+
 Tn_VerilogToken* tokenOf(const TokenRef& t) { return static_cast<Tn_VerilogToken*>(t.get()); }
 int typeOf(const TokenRef& t) { return t ? t->getType() : 0; }
 const std::string& textOf(const TokenRef& t) { return tokenOf(t)->textRef(); }
@@ -458,6 +473,52 @@ Tn_VerilogParser::Tn_VerilogParser(const Tn_VerilogOptions& options, Tn_VerilogD
 
 Tn_VerilogParser::~Tn_VerilogParser() {}
 
+void Tn_VerilogParser::fillLookahead(unsigned int i) {
+    Lookahead& a = ahead_;
+    if (i > a.mask + 1 || a.slots.empty()) {
+        // Grow (a power of two), keeping the tokens ahead in order.
+        size_t size = a.slots.empty() ? 8 : a.slots.size();
+        while (size < i) size *= 2;
+        std::vector<Slot> slots(size);
+        for (unsigned int k = 0; k < a.count; ++k) std::swap(slots[k], a.slots[(a.head + k) & a.mask]);
+        a.slots.swap(slots);
+        a.head = 0;
+        a.mask = static_cast<unsigned int>(size - 1);
+    }
+    // Meta comments are skipped, as the token filter would hide them.
+    Tn_VerilogLexer& lexer = d_->filter.lexer();
+    Tn_VerilogScannerState& state = lexer.state();
+    while (a.count < i) {
+        int type;
+        do type = lexer.nextType();
+        while (type == METACOMMENT);
+        Slot& s = a.slots[(a.head + a.count) & a.mask];
+        s.type = type;
+        // Only names, numbers, strings and strays have a text of their own.
+        s.hasText = ownText(type);
+        if (s.hasText) s.text.assign(state.text);
+        if (s.file.get() != state.file.get()) s.file = state.file;
+        s.line = state.line;
+        s.column = state.column;
+        ++a.count;
+    }
+}
+
+TokenRef Tn_VerilogGrammarUtil::lookaheadToken(unsigned int i) {
+    if (i > ahead_.count) fillLookahead(i);
+    Slot& s = ahead_.at(i);
+    if (!s.token) {
+        if (!s.hasText) s.text.assign(fixedText(s.type));
+        s.token = TokenRef(new Tn_VerilogToken(s.type, s.text, s.file, s.line, s.column));
+    }
+    return s.token;
+}
+
+void Tn_VerilogGrammarUtil::clearLookahead() {
+    for (Slot& s : ahead_.slots) s.token = TokenRef();
+    ahead_.head = ahead_.count = 0;
+}
+
 void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn_StringList* compiled) {
     Impl& d = *d_;
     d.library = &library;
@@ -467,8 +528,7 @@ void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn
     verilog2001_ = d.options.verilog2001() != 0;
     resetNesting();
     d.filter.lexer().startFiles(files);
-    d.filter.reset();
-    inputState->getInput().reset();
+    clearLookahead();
     d.scratch.reset(new Tn_VerilogDesignUnit(library.name(), Port_String(), d.options));
     d.factory = &d.scratch->factory();
     try {
@@ -483,6 +543,7 @@ void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn
         reportError(e.getMessage());
     }
     // A unit cut short by the error is dropped; the ones before it stay.
+    clearLookahead();
     d.unit.reset();
     d.scopes.clear();
     d.namesArena.clear();
@@ -512,9 +573,7 @@ Tn_VerilogExpression* Tn_VerilogParser::readExpression(Tn_VerilogNodeFactory& fa
     d.factory = &factory;
     std::string message;
     try {
-        Tn_VerilogExpression* e = expression();
-        if (LA(1) == antlr::Token::EOF_TYPE) return e;
-        message = "unexpected token: " + LT(1)->getText();
+        return singleExpression();
     } catch (const antlr::TokenStreamRecognitionException& e) {
         message = e.getMessage();
     } catch (const NestingException& e) {

@@ -16,6 +16,7 @@
 #include "library/tn_node.h"
 #include "src/tn_verilogoptions.h"
 #include "util/tn_exception.h"
+#include "util/tn_rcstring.h"
 #include "verilog/Tn_VerilogGrammar.hpp"
 #include "verilog/tn_verilogenums.h"
 
@@ -76,6 +77,7 @@ public:
     void reportWarning(const std::string& s) override;
     // The file of the current lookahead token.
     std::string getFilename() const override;
+
 
 protected:
     // Construction hooks (tn_veriloggrammarutil.h).
@@ -258,6 +260,7 @@ public:
 private:
     // The one expression of a token stream started on a text.
     Tn_VerilogExpression* readExpression(Tn_VerilogNodeFactory& factory);
+    void fillLookahead(unsigned int i) override;
 
     std::unique_ptr<Impl> d_;
 };

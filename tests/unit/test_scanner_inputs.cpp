@@ -103,7 +103,7 @@ TEST_F(ScannerInputs, EveryCallOfADriverScansItsSourcesAnew) {
 }
 
 TEST_F(ScannerInputs, CompileReportsScannerErrorsAsTheParserWill) {
-    const std::string a = dir.write("a.v", "x\n`else\n");
+    const std::string a = dir.write("a.v", "module x;\n`else\nendmodule\n");
     Tn_VerilogCompiler driver;
     EXPECT_EQ(driver.compile({"tarn", a.c_str(), "-top", "x"}), 1);
     EXPECT_EQ(sink.errors(), (Strings{"\"" + a + "\" line 2 Illegal `else directive\n"}));
