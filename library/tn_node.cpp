@@ -1,7 +1,8 @@
 #include "library/tn_node.h"
 
 #include <new>
-#include <vector>
+
+#include "port/kor_memory.h"
 
 int32_t Tn_Node::s_generation = 0;
 
@@ -17,7 +18,7 @@ const bool kPooling = true;
 #endif
 const std::size_t kStep = 16;
 const std::size_t kLargest = 1024;
-const std::size_t kBlock = std::size_t(1) << 20;
+const std::size_t kBlock = std::size_t(4) << 20;
 
 struct FreeNode {
     FreeNode* next;
@@ -27,7 +28,6 @@ struct NodePool {
     FreeNode* free[kLargest / kStep + 1] = {};
     char* next = nullptr;  // unused rest of the current block
     char* end = nullptr;
-    std::vector<char*> blocks;  // kept for the life of the process
 };
 
 NodePool& pool() {
@@ -49,9 +49,10 @@ void* Tn_Node::operator new(std::size_t size) {
     }
     const std::size_t bytes = c * kStep;
     if (static_cast<std::size_t>(p.end - p.next) < bytes) {
-        p.next = static_cast<char*>(::operator new(kBlock));
+        // Blocks live as long as the process; their nodes are reused.
+        p.next = static_cast<char*>(kor_allocBlock(kBlock));
+        if (!p.next) throw std::bad_alloc();
         p.end = p.next + kBlock;
-        p.blocks.push_back(p.next);
     }
     void* r = p.next;
     p.next += bytes;

@@ -23,7 +23,10 @@ SymbolTable& table() {
 
 Tn_Symbol::Tn_Symbol(const char* text) : s_(intern(text ? text : "", text ? std::strlen(text) : 0)) {}
 
+const Port_String Tn_Symbol::s_empty;
+
 const Port_String* Tn_Symbol::intern(const char* text, size_t length) {
+    if (length == 0) return &s_empty;
     SymbolTable& t = table();
     auto it = t.index.find(std::string_view(text, length));
     if (it != t.index.end()) return it->second;
@@ -31,11 +34,6 @@ const Port_String* Tn_Symbol::intern(const char* text, size_t length) {
     const Port_String* s = &t.texts.back();
     t.index.emplace(std::string_view(s->c_str(), length), s);
     return s;
-}
-
-const Port_String* Tn_Symbol::empty() {
-    static const Port_String* e = intern("", 0);
-    return e;
 }
 
 size_t Tn_Symbol::internedCount() { return table().texts.size(); }

@@ -11,8 +11,8 @@
 
 class Tn_Symbol {
 public:
-    // The empty text.
-    Tn_Symbol() : s_(empty()) {}
+    // The empty text (cheap: parsers make many empty symbols).
+    Tn_Symbol() : s_(&s_empty) {}
     Tn_Symbol(const Port_String& text) : s_(intern(text.c_str(), static_cast<size_t>(text.GetLength()))) {}
     Tn_Symbol(const char* text);
     Tn_Symbol(const char* text, size_t length) : s_(intern(text, length)) {}
@@ -34,7 +34,8 @@ public:
 
 private:
     static const Port_String* intern(const char* text, size_t length);
-    static const Port_String* empty();
+    static const Port_String* empty() { return &s_empty; }
+    static const Port_String s_empty;
     const Port_String* s_;
 };
 

@@ -55,76 +55,79 @@ singleExpression returns [Tn_VerilogExpression* e = 0]
     ;
 
 description
-{ Tn_VerilogAttributes* a = 0; }
+{ Tn_VerilogTok t; Tn_VerilogAttributes* a = 0; }
     : a=attributeInstances
       ( moduleDeclaration[a]
       | udpDeclaration[a]
-      | t:K_CONFIG { skipConfiguration(t); }
+      | { t = tok(); } K_CONFIG { skipConfiguration(t); }
       )
     ;
 
 attributeInstances returns [Tn_VerilogAttributes* a = 0]
-    : ( { v2001() }? t:ATTR_OPEN { if (!a) a = attributesBegin(t); }
+{ Tn_VerilogTok t; }
+    : ( { v2001() }? { t = tok(); } ATTR_OPEN { if (!a) a = attributesBegin(t); }
         attributeSpec[a] ( COMMA attributeSpec[a] )* ATTR_CLOSE
       )*
     ;
 
 attributeSpec[Tn_VerilogAttributes* a]
-{ Tn_VerilogExpression* e = 0; }
-    : id:IDENTIFIER ( ASSIGN e=constantExpression )? { attributeAdd(a, id, e); }
+{ Tn_VerilogTok id; Tn_VerilogExpression* e = 0; }
+    : { id = tok(); } IDENTIFIER ( ASSIGN e=constantExpression )? { attributeAdd(a, id, e); }
     ;
 
 // ---------------------------------------------------------------- modules
 
 moduleDeclaration[Tn_VerilogAttributes* a]
-{ TokenRef kw = LT(1); }
-    : ( K_MODULE | K_MACROMODULE ) id:IDENTIFIER { beginModule(kw, id, a); }
+{ Tn_VerilogTok id, e; Tn_VerilogTok kw = tok(); }
+    : ( K_MODULE | K_MACROMODULE ) { id = tok(); } IDENTIFIER { beginModule(kw, id, a); }
       ( { v2001() }? parameterPortList )?
       ( portList )?
       SEMI
       ( moduleItem )*
-      e:K_ENDMODULE { endModule(e); }
+      { e = tok(); } K_ENDMODULE { endModule(e); }
     ;
 
 parameterPortList
 { Tn_VerilogParamSpec s; }
     : HASH LPAREN
-      { s.first = LT(1); } ( parameterKeyword[s] )? parameterType[s] parameterAssignments[s]
+      { s.first = tok(); } ( parameterKeyword[s] )? parameterType[s] parameterAssignments[s]
       ( COMMA parameterKeyword[s] parameterType[s] parameterAssignments[s] )*
       RPAREN
     ;
 
 parameterKeyword[Tn_VerilogParamSpec& s]
-    : t:K_PARAMETER { s = Tn_VerilogParamSpec(); s.first = t; }
-    | u:K_LOCALPARAM { s = Tn_VerilogParamSpec(); s.first = u; s.local = true; }
+{ Tn_VerilogTok t, u; }
+    : { t = tok(); } K_PARAMETER { s = Tn_VerilogParamSpec(); s.first = t; }
+    | { u = tok(); } K_LOCALPARAM { s = Tn_VerilogParamSpec(); s.first = u; s.local = true; }
     ;
 
 portList
-    : lp:LPAREN
+{ Tn_VerilogTok lp, c; }
+    : { lp = tok(); } LPAREN
       ( { v2001() && isAnsiPortStart(LA(1)) }? ansiPortDeclarations
       | { LA(1) == RPAREN }?
-      | port[lp] ( c:COMMA port[c] )*
+      | port[lp] ( { c = tok(); } COMMA port[c] )*
       )
       RPAREN
     ;
 
-port[TokenRef where]
-{ Tn_VerilogExpression* e = 0; }
-    : DOT id:IDENTIFIER LPAREN ( e=portExpression )? RPAREN { modulePort(id, id, e); }
-    | ( e=portExpression )? { modulePort(where, TokenRef(), e); }
+port[Tn_VerilogTok where]
+{ Tn_VerilogTok id; Tn_VerilogExpression* e = 0; }
+    : DOT { id = tok(); } IDENTIFIER LPAREN ( e=portExpression )? RPAREN { modulePort(id, id, e); }
+    | ( e=portExpression )? { modulePort(where, Tn_VerilogTok(), e); }
     ;
 
 portExpression returns [Tn_VerilogExpression* e = 0]
-{ Tn_VerilogExpression* r = 0; }
+{ Tn_VerilogTok t; Tn_VerilogExpression* r = 0; }
     : e=portReference
-    | t:LBRACE r=portReference { e = makeConcatenation(t, r); }
+    | { t = tok(); } LBRACE r=portReference { e = makeConcatenation(t, r); }
       ( COMMA r=portReference { concatenationAdd(e, r); } )* RBRACE
     ;
 
 portReference returns [Tn_VerilogExpression* e = 0]
-{ Tn_VerilogExpression* m = 0; Tn_VerilogExpression* l = 0; }
-    : id:IDENTIFIER { e = portReferenceName(id); }
-      ( lb:LBRACKET m=constantExpression
+{ Tn_VerilogTok id, lb; Tn_VerilogExpression* m = 0; Tn_VerilogExpression* l = 0; }
+    : { id = tok(); } IDENTIFIER { e = portReferenceName(id); }
+      ( { lb = tok(); } LBRACKET m=constantExpression
         ( COLON l=constantExpression { e = partSelect(lb, e, m, l); }
         | { e = bitSelect(lb, e, m); }
         )
@@ -133,25 +136,25 @@ portReference returns [Tn_VerilogExpression* e = 0]
     ;
 
 ansiPortDeclarations
-{ Tn_VerilogDeclSpec s; Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok id; Tn_VerilogDeclSpec s; Tn_VerilogExpression* e = 0; }
     : ansiPortDeclaration[s]
       ( options { greedy = true; } :
         COMMA
-        ( { e = 0; } id:IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id, e); }
+        ( { e = 0; } { id = tok(); } IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id, e); }
         | ansiPortDeclaration[s]
         )
       )*
     ;
 
 ansiPortDeclaration[Tn_VerilogDeclSpec& s]
-{ Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok id; Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* e = 0; }
     : a=attributeInstances { s = Tn_VerilogDeclSpec(); s.attributes = a; s.ansi = true; }
       portDirection[s] portType[s]
-      id:IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id, e); }
+      { id = tok(); } IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id, e); }
     ;
 
 portDirection[Tn_VerilogDeclSpec& s]
-{ s.first = LT(1); s.direction = LA(1); }
+{ s.first = tok(); s.direction = LA(1); }
     : K_INPUT | K_OUTPUT | K_INOUT
     ;
 
@@ -209,16 +212,16 @@ moduleOrGenerateItem[Tn_VerilogAttributes* a]
 // ----------------------------------------------------------- declarations
 
 portDeclaration[Tn_VerilogAttributes* a]
-{ Tn_VerilogDeclSpec s; Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok id, id2; Tn_VerilogDeclSpec s; Tn_VerilogExpression* e = 0; }
     : { s.attributes = a; } portDirection[s] portType[s]
-      id:IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id, e); }
-      ( COMMA { e = 0; } id2:IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id2, e); } )*
+      { id = tok(); } IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id, e); }
+      ( COMMA { e = 0; } { id2 = tok(); } IDENTIFIER ( ASSIGN e=constantExpression )? { declarePort(s, id2, e); } )*
       SEMI
     ;
 
 netDeclaration[Tn_VerilogAttributes* a]
 { Tn_VerilogDeclSpec s; int t = 0; int c = 0; Tn_VerilogDriveStrength* ds = 0; Tn_VerilogRange* r = 0; Tn_VerilogDelay* d = 0; }
-    : { s.attributes = a; s.first = LT(1); s.kind = Tn_VerilogDeclSpec::NET; }
+    : { s.attributes = a; s.first = tok(); s.kind = Tn_VerilogDeclSpec::NET; }
       t=netTypeKeyword { s.netType = t; }
       ( { LA(1) == LPAREN && isChargeStrength(LA(2)) }? c=chargeStrength { s.chargeStrength = c; }
       | { LA(1) == LPAREN && isStrength(LA(2)) }? ds=driveStrength { s.strength = ds; }
@@ -231,8 +234,8 @@ netDeclaration[Tn_VerilogAttributes* a]
     ;
 
 netItem[Tn_VerilogDeclSpec& s]
-{ Tn_VerilogExpression* e = 0; size_t m = dimensionsBegin(); }
-    : id:IDENTIFIER
+{ Tn_VerilogTok id; Tn_VerilogExpression* e = 0; size_t m = dimensionsBegin(); }
+    : { id = tok(); } IDENTIFIER
       ( ASSIGN e=expression { declareNet(s, id, m, e); }
       | dimensions { declareNet(s, id, m, 0); }
       )
@@ -245,7 +248,7 @@ dimensions
 
 variableDeclaration[Tn_VerilogAttributes* a]
 { Tn_VerilogDeclSpec s; Tn_VerilogRange* r = 0; int v = 0; }
-    : { s.attributes = a; s.first = LT(1); }
+    : { s.attributes = a; s.first = tok(); }
       ( K_REG { s.kind = Tn_VerilogDeclSpec::REG; } ( K_SIGNED { s.isSigned = true; } )? ( r=range { s.range = r; } )?
       | v=variableTypeKeyword { s.kind = v; }
       )
@@ -253,26 +256,27 @@ variableDeclaration[Tn_VerilogAttributes* a]
     ;
 
 variableItem[Tn_VerilogDeclSpec& s]
-{ Tn_VerilogExpression* e = 0; size_t m = dimensionsBegin(); }
-    : id:IDENTIFIER
+{ Tn_VerilogTok id; Tn_VerilogExpression* e = 0; size_t m = dimensionsBegin(); }
+    : { id = tok(); } IDENTIFIER
       ( { v2001() }? ASSIGN e=constantExpression { declareVariable(s, id, m, e); }
       | dimensions { declareVariable(s, id, m, 0); }
       )
     ;
 
 eventDeclaration[Tn_VerilogAttributes* a]
-{ Tn_VerilogDeclSpec s; }
-    : t:K_EVENT { s.attributes = a; s.first = t; s.kind = Tn_VerilogDeclSpec::EVENT; }
+{ Tn_VerilogTok t; Tn_VerilogDeclSpec s; }
+    : { t = tok(); } K_EVENT { s.attributes = a; s.first = t; s.kind = Tn_VerilogDeclSpec::EVENT; }
       eventItem[s] ( COMMA eventItem[s] )* SEMI
     ;
 
 eventItem[Tn_VerilogDeclSpec& s]
-{ size_t m = dimensionsBegin(); }
-    : id:IDENTIFIER dimensions { declareVariable(s, id, m, 0); }
+{ Tn_VerilogTok id; size_t m = dimensionsBegin(); }
+    : { id = tok(); } IDENTIFIER dimensions { declareVariable(s, id, m, 0); }
     ;
 
 genvarDeclaration[Tn_VerilogAttributes* a]
-    : K_GENVAR id:IDENTIFIER { declareGenvar(id, a); } ( COMMA id2:IDENTIFIER { declareGenvar(id2, a); } )* SEMI
+{ Tn_VerilogTok id, id2; }
+    : K_GENVAR { id = tok(); } IDENTIFIER { declareGenvar(id, a); } ( COMMA { id2 = tok(); } IDENTIFIER { declareGenvar(id2, a); } )* SEMI
     ;
 
 parameterDeclaration[Tn_VerilogAttributes* a]
@@ -290,23 +294,23 @@ parameterType[Tn_VerilogParamSpec& s]
 // malformed item is reported and skipped, and parsing goes on after it.
 parameterAssignments[Tn_VerilogParamSpec& s]
 options { defaultErrorHandler = true; }
-{ Tn_VerilogExpression* e = 0; }
-    : id:IDENTIFIER ASSIGN e=constantExpression { declareParameter(s, id, e); }
+{ Tn_VerilogTok id, id2; Tn_VerilogExpression* e = 0; }
+    : { id = tok(); } IDENTIFIER ASSIGN e=constantExpression { declareParameter(s, id, e); }
       ( options { greedy = true; } :
-        { LA(2) == IDENTIFIER }? COMMA id2:IDENTIFIER ASSIGN e=constantExpression { declareParameter(s, id2, e); }
+        { LA(2) == IDENTIFIER }? COMMA { id2 = tok(); } IDENTIFIER ASSIGN e=constantExpression { declareParameter(s, id2, e); }
       )*
     ;
 
 specparamDeclaration[Tn_VerilogAttributes* a]
-{ Tn_VerilogParamSpec s; Tn_VerilogRange* r = 0; }
-    : t:K_SPECPARAM { s.first = t; s.attributes = a; s.specparam = true; } ( r=range { s.range = r; } )?
+{ Tn_VerilogTok t; Tn_VerilogParamSpec s; Tn_VerilogRange* r = 0; }
+    : { t = tok(); } K_SPECPARAM { s.first = t; s.attributes = a; s.specparam = true; } ( r=range { s.range = r; } )?
       specparamAssignment[s] ( COMMA specparamAssignment[s] )* SEMI
     ;
 
 specparamAssignment[Tn_VerilogParamSpec& s]
-{ Tn_VerilogExpression* e = 0; Tn_VerilogExpression* e2 = 0; }
-    : id:IDENTIFIER ASSIGN
-      ( { isPulseControlName(id) && LA(1) == LPAREN }? lp:LPAREN e=mintypmaxExpression
+{ Tn_VerilogTok id, lp; Tn_VerilogExpression* e = 0; Tn_VerilogExpression* e2 = 0; }
+    : { id = tok(); } IDENTIFIER ASSIGN
+      ( { isPulseControlName(id) && LA(1) == LPAREN }? { lp = tok(); } LPAREN e=mintypmaxExpression
         ( COMMA e2=mintypmaxExpression { e = pulseLimits(lp, e, e2); } )? RPAREN
       | e=constantExpression
       )
@@ -314,10 +318,11 @@ specparamAssignment[Tn_VerilogParamSpec& s]
     ;
 
 defparamDeclaration[Tn_VerilogAttributes* a]
-    : t:K_DEFPARAM defparamAssignment[t, a] ( COMMA defparamAssignment[t, a] )* SEMI
+{ Tn_VerilogTok t; }
+    : { t = tok(); } K_DEFPARAM defparamAssignment[t, a] ( COMMA defparamAssignment[t, a] )* SEMI
     ;
 
-defparamAssignment[TokenRef t, Tn_VerilogAttributes* a]
+defparamAssignment[Tn_VerilogTok t, Tn_VerilogAttributes* a]
 { Tn_VerilogExpression* n = 0; Tn_VerilogExpression* e = 0; }
     : n=name ASSIGN e=constantExpression { defparam(t, a, n, e); }
     ;
@@ -325,7 +330,8 @@ defparamAssignment[TokenRef t, Tn_VerilogAttributes* a]
 // ------------------------------------------------- strengths, ranges, delays
 
 driveStrength returns [Tn_VerilogDriveStrength* s = 0]
-    : t:LPAREN { s = driveStrengthBegin(t); }
+{ Tn_VerilogTok t; }
+    : { t = tok(); } LPAREN { s = driveStrengthBegin(t); }
       { driveStrengthAdd(s, LA(1)); } strengthKeyword
       ( COMMA { driveStrengthAdd(s, LA(1)); } strengthKeyword )?
       RPAREN
@@ -343,13 +349,13 @@ chargeStrength returns [int c = -1]
     ;
 
 range returns [Tn_VerilogRange* r = 0]
-{ Tn_VerilogExpression* m = 0; Tn_VerilogExpression* l = 0; }
-    : t:LBRACKET m=constantExpression COLON l=constantExpression RBRACKET { r = makeRange(t, m, l); }
+{ Tn_VerilogTok t; Tn_VerilogExpression* m = 0; Tn_VerilogExpression* l = 0; }
+    : { t = tok(); } LBRACKET m=constantExpression COLON l=constantExpression RBRACKET { r = makeRange(t, m, l); }
     ;
 
 delay3 returns [Tn_VerilogDelay* d = 0]
-{ Tn_VerilogExpression* e = 0; }
-    : t:HASH { d = delayBegin(t); }
+{ Tn_VerilogTok t; Tn_VerilogExpression* e = 0; }
+    : { t = tok(); } HASH { d = delayBegin(t); }
       ( e=delayValue { delayAdd(d, e); }
       | LPAREN e=mintypmaxExpression { delayAdd(d, e); }
         ( COMMA e=mintypmaxExpression { delayAdd(d, e); }
@@ -360,21 +366,22 @@ delay3 returns [Tn_VerilogDelay* d = 0]
     ;
 
 delayValue returns [Tn_VerilogExpression* e = 0]
+{ Tn_VerilogTok id; }
     : e=number
-    | id:IDENTIFIER { e = simpleName(id); }
+    | { id = tok(); } IDENTIFIER { e = simpleName(id); }
     ;
 
 // ------------------------------------------------------------- assignments
 
 continuousAssign[Tn_VerilogAttributes* a]
-{ Tn_VerilogDriveStrength* s = 0; Tn_VerilogDelay* d = 0; }
-    : t:K_ASSIGN
+{ Tn_VerilogTok t; Tn_VerilogDriveStrength* s = 0; Tn_VerilogDelay* d = 0; }
+    : { t = tok(); } K_ASSIGN
       ( { LA(1) == LPAREN && isStrength(LA(2)) }? s=driveStrength )?
       ( d=delay3 )?
       continuousAssignment[t, a, s, d] ( COMMA continuousAssignment[t, a, s, d] )* SEMI
     ;
 
-continuousAssignment[TokenRef t, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s, Tn_VerilogDelay* d]
+continuousAssignment[Tn_VerilogTok t, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s, Tn_VerilogDelay* d]
 { Tn_VerilogExpression* l = 0; Tn_VerilogExpression* e = 0; }
     : l=lvalue ASSIGN e=expression { contAssign(t, a, s, d, l, e); }
     ;
@@ -383,7 +390,7 @@ continuousAssignment[TokenRef t, Tn_VerilogAttributes* a, Tn_VerilogDriveStrengt
 
 gateInstantiation[Tn_VerilogAttributes* a]
 { Tn_VerilogInstSpec s; Tn_VerilogDriveStrength* ds = 0; Tn_VerilogDelay* d = 0; }
-    : { s.first = LT(1); s.attributes = a; s.gateType = LA(1); } gateKeyword
+    : { s.first = tok(); s.attributes = a; s.gateType = LA(1); } gateKeyword
       ( { LA(1) == LPAREN && isStrength(LA(2)) }? ds=driveStrength { s.strength = ds; } )?
       ( d=delay3 { s.delay = d; } )?
       gateInstance[s] ( COMMA gateInstance[s] )* SEMI
@@ -398,16 +405,16 @@ gateKeyword
     ;
 
 gateInstance[Tn_VerilogInstSpec& s]
-{ Tn_VerilogRange* r = 0; Tn_VerilogNode* g = 0; Tn_VerilogExpression* e = 0; }
-    : ( id:IDENTIFIER ( r=range )? )?
-      lp:LPAREN { g = gateBegin(s, id, r, lp); }
+{ Tn_VerilogTok id, lp; Tn_VerilogRange* r = 0; Tn_VerilogNode* g = 0; Tn_VerilogExpression* e = 0; }
+    : ( { id = tok(); } IDENTIFIER ( r=range )? )?
+      { lp = tok(); } LPAREN { g = gateBegin(s, id, r, lp); }
       e=expression { gateTerminal(g, e); } ( COMMA e=expression { gateTerminal(g, e); } )*
       RPAREN { gateEnd(s, g); }
     ;
 
 instantiation[Tn_VerilogAttributes* a]
-{ Tn_VerilogInstSpec s; Tn_VerilogDriveStrength* ds = 0; }
-    : def:IDENTIFIER { s.first = def; s.attributes = a; s.paramsBegin = parameterValuesBegin(); }
+{ Tn_VerilogTok def; Tn_VerilogInstSpec s; Tn_VerilogDriveStrength* ds = 0; }
+    : { def = tok(); } IDENTIFIER { s.first = def; s.attributes = a; s.paramsBegin = parameterValuesBegin(); }
       ( { LA(1) == LPAREN && isStrength(LA(2)) }? ds=driveStrength { s.strength = ds; } )?
       ( parameterValueAssignment[s] )?
       moduleInstance[s] ( COMMA moduleInstance[s] )* SEMI
@@ -415,90 +422,90 @@ instantiation[Tn_VerilogAttributes* a]
     ;
 
 parameterValueAssignment[Tn_VerilogInstSpec& s]
-{ Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok lp; Tn_VerilogExpression* e = 0; }
     : HASH { s.hasParameters = true; }
-      ( e=delayValue { paramValue(s, TokenRef(), e); }
-      | lp:LPAREN ( parameterValue[s] ( COMMA parameterValue[s] )* )? RPAREN
+      ( e=delayValue { paramValue(s, Tn_VerilogTok(), e); }
+      | { lp = tok(); } LPAREN ( parameterValue[s] ( COMMA parameterValue[s] )* )? RPAREN
       )
     ;
 
 parameterValue[Tn_VerilogInstSpec& s]
 { Tn_VerilogExpression* e = 0; }
     : namedParameterValue[s]
-    | e=mintypmaxExpression { paramValue(s, TokenRef(), e); }
+    | e=mintypmaxExpression { paramValue(s, Tn_VerilogTok(), e); }
     ;
 
 // A named parameter value assignment: a malformed one is reported and
 // skipped, and the instance is still read.
 namedParameterValue[Tn_VerilogInstSpec& s]
 options { defaultErrorHandler = true; }
-{ Tn_VerilogExpression* e = 0; }
-    : DOT id:IDENTIFIER LPAREN ( e=mintypmaxExpression )? RPAREN { paramValue(s, id, e); }
+{ Tn_VerilogTok id; Tn_VerilogExpression* e = 0; }
+    : DOT { id = tok(); } IDENTIFIER LPAREN ( e=mintypmaxExpression )? RPAREN { paramValue(s, id, e); }
     ;
 
 moduleInstance[Tn_VerilogInstSpec& s]
-{ Tn_VerilogRange* r = 0; Tn_VerilogNode* inst = 0; }
-    : ( id:IDENTIFIER ( r=range )? )?
-      lp:LPAREN { inst = instanceBegin(s, id, r, lp); }
+{ Tn_VerilogTok id, lp; Tn_VerilogRange* r = 0; Tn_VerilogNode* inst = 0; }
+    : ( { id = tok(); } IDENTIFIER ( r=range )? )?
+      { lp = tok(); } LPAREN { inst = instanceBegin(s, id, r, lp); }
       ( { LA(1) != RPAREN }? portConnection[inst] ( COMMA portConnection[inst] )* )?
       RPAREN
     ;
 
 portConnection[Tn_VerilogNode* inst]
-{ Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok id; Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* e = 0; }
     : a=attributeInstances
-      ( DOT id:IDENTIFIER LPAREN ( e=expression )? RPAREN { connection(inst, a, id, id, e); }
-      | ( e=expression )? { connection(inst, a, LT(1), TokenRef(), e); }
+      ( DOT { id = tok(); } IDENTIFIER LPAREN ( e=expression )? RPAREN { connection(inst, a, id, id, e); }
+      | ( e=expression )? { connection(inst, a, tok(), Tn_VerilogTok(), e); }
       )
     ;
 
 // ------------------------------------------------------- processes, tasks
 
 initialConstruct[Tn_VerilogAttributes* a]
-{ Tn_VerilogStatement* s = 0; }
-    : t:K_INITIAL s=statement { process(t, a, s); }
+{ Tn_VerilogTok t; Tn_VerilogStatement* s = 0; }
+    : { t = tok(); } K_INITIAL s=statement { process(t, a, s); }
     ;
 
 alwaysConstruct[Tn_VerilogAttributes* a]
-{ Tn_VerilogStatement* s = 0; }
-    : t:K_ALWAYS s=statement { process(t, a, s); }
+{ Tn_VerilogTok t; Tn_VerilogStatement* s = 0; }
+    : { t = tok(); } K_ALWAYS s=statement { process(t, a, s); }
     ;
 
 taskDeclaration[Tn_VerilogAttributes* a]
-{ bool automatic = false; Tn_VerilogStatement* s = 0; }
-    : t:K_TASK ( K_AUTOMATIC { automatic = true; } )? id:IDENTIFIER { taskBegin(t, id, a, automatic); }
+{ Tn_VerilogTok t, id, e; bool automatic = false; Tn_VerilogStatement* s = 0; }
+    : { t = tok(); } K_TASK ( K_AUTOMATIC { automatic = true; } )? { id = tok(); } IDENTIFIER { taskBegin(t, id, a, automatic); }
       ( SEMI ( options { generateAmbigWarnings = false; } : { declarationAhead(true) }? blockDeclaration[true] )*
       | { v2001() }? LPAREN ( tfPortList )? RPAREN SEMI
         ( options { generateAmbigWarnings = false; } : { declarationAhead(false) }? blockDeclaration[false] )*
       )
       ( s=statement { procedureBody(s); } )?
-      e:K_ENDTASK { taskEnd(e); }
+      { e = tok(); } K_ENDTASK { taskEnd(e); }
     ;
 
 functionDeclaration[Tn_VerilogAttributes* a]
-{ Tn_VerilogDeclSpec r; bool automatic = false; Tn_VerilogStatement* s = 0; Tn_VerilogRange* rr = 0; int v = 0; }
-    : t:K_FUNCTION ( K_AUTOMATIC { automatic = true; } )?
+{ Tn_VerilogTok t, id, e; Tn_VerilogDeclSpec r; bool automatic = false; Tn_VerilogStatement* s = 0; Tn_VerilogRange* rr = 0; int v = 0; }
+    : { t = tok(); } K_FUNCTION ( K_AUTOMATIC { automatic = true; } )?
       { r.first = t; }
       ( K_SIGNED { r.isSigned = true; } )?
       ( rr=range { r.range = rr; } | v=variableTypeKeyword { r.kind = v; } )?
-      id:IDENTIFIER { functionBegin(t, id, a, automatic, r); }
+      { id = tok(); } IDENTIFIER { functionBegin(t, id, a, automatic, r); }
       ( SEMI ( options { generateAmbigWarnings = false; } : { declarationAhead(true) }? blockDeclaration[true] )*
       | { v2001() }? LPAREN tfPortList RPAREN SEMI
         ( options { generateAmbigWarnings = false; } : { declarationAhead(false) }? blockDeclaration[false] )*
       )
       s=statement { procedureBody(s); }
-      e:K_ENDFUNCTION { functionEnd(e); }
+      { e = tok(); } K_ENDFUNCTION { functionEnd(e); }
     ;
 
 tfPortList
-{ Tn_VerilogDeclSpec s; Tn_VerilogAttributes* a = 0; }
+{ Tn_VerilogTok id, id2, id3; Tn_VerilogDeclSpec s; Tn_VerilogAttributes* a = 0; }
     : a=attributeInstances { s.attributes = a; } tfPortDirection[s]
-      id:IDENTIFIER { declarePort(s, id, 0); }
+      { id = tok(); } IDENTIFIER { declarePort(s, id, 0); }
       ( options { greedy = true; } :
         COMMA
-        ( id2:IDENTIFIER { declarePort(s, id2, 0); }
+        ( { id2 = tok(); } IDENTIFIER { declarePort(s, id2, 0); }
         | a=attributeInstances { s = Tn_VerilogDeclSpec(); s.attributes = a; } tfPortDirection[s]
-          id3:IDENTIFIER { declarePort(s, id3, 0); }
+          { id3 = tok(); } IDENTIFIER { declarePort(s, id3, 0); }
         )
       )*
     ;
@@ -515,11 +522,11 @@ tfPortDirection[Tn_VerilogDeclSpec& s]
 // Declarations of tasks, functions and named blocks; ports only where
 // allowed.
 blockDeclaration[bool ports]
-{ Tn_VerilogAttributes* a = 0; Tn_VerilogDeclSpec s; }
+{ Tn_VerilogTok id, id2; Tn_VerilogAttributes* a = 0; Tn_VerilogDeclSpec s; }
     : a=attributeInstances
       ( { ports }? { s.attributes = a; } tfPortDirection[s]
-        id:IDENTIFIER { declarePort(s, id, 0); }
-        ( COMMA id2:IDENTIFIER { declarePort(s, id2, 0); } )* SEMI
+        { id = tok(); } IDENTIFIER { declarePort(s, id, 0); }
+        ( COMMA { id2 = tok(); } IDENTIFIER { declarePort(s, id2, 0); } )* SEMI
       | variableDeclaration[a]
       | eventDeclaration[a]
       | parameterDeclaration[a]
@@ -529,7 +536,8 @@ blockDeclaration[bool ports]
 // ------------------------------------------------------------- generate
 
 generateRegion
-    : t:K_GENERATE { generateRegionBegin(t); } ( generateItem )* K_ENDGENERATE { generateRegionEnd(); }
+{ Tn_VerilogTok t; }
+    : { t = tok(); } K_GENERATE { generateRegionBegin(t); } ( generateItem )* K_ENDGENERATE { generateRegionEnd(); }
     ;
 
 generateItem
@@ -542,8 +550,8 @@ generateItem
 
 // A begin-end block standing alone in a generate region or block.
 generateNamedBlock
-{ Nest nest(*this); Tn_VerilogGenerateStatement* g = 0; }
-    : b:K_BEGIN ( COLON id:IDENTIFIER )? { g = generateBlockBegin(b, id); }
+{ Tn_VerilogTok b, id; Nest nest(*this); Tn_VerilogGenerateStatement* g = 0; }
+    : { b = tok(); } K_BEGIN ( COLON { id = tok(); } IDENTIFIER )? { g = generateBlockBegin(b, id); }
       ( generateItem )* K_END { generateBlockEnd(g); addGenerateStatement(g); }
     ;
 
@@ -553,42 +561,42 @@ generateConstruct[Tn_VerilogAttributes* a]
     ;
 
 generateFor returns [Tn_VerilogGenerateStatement* g = 0]
-{ Nest nest(*this); Tn_VerilogExpression* i = 0; Tn_VerilogExpression* c = 0; Tn_VerilogExpression* s = 0; }
-    : t:K_FOR LPAREN ( gv:K_GENVAR )? id:IDENTIFIER ASSIGN i=constantExpression SEMI
+{ Tn_VerilogTok t, gv, id, id2; Nest nest(*this); Tn_VerilogExpression* i = 0; Tn_VerilogExpression* c = 0; Tn_VerilogExpression* s = 0; }
+    : { t = tok(); } K_FOR LPAREN ( { gv = tok(); } K_GENVAR )? { id = tok(); } IDENTIFIER ASSIGN i=constantExpression SEMI
       c=constantExpression SEMI
-      id2:IDENTIFIER ASSIGN s=constantExpression RPAREN
+      { id2 = tok(); } IDENTIFIER ASSIGN s=constantExpression RPAREN
       { g = generateForBegin(t, gv, id, i, c, id2, s); }
       generateLoopBody[g]
     ;
 
 generateLoopBody[Tn_VerilogGenerateStatement* g]
-{ Tn_VerilogAttributes* a = 0; }
+{ Tn_VerilogTok b, id; Tn_VerilogAttributes* a = 0; }
     : ( options { generateAmbigWarnings = false; } :
-      b:K_BEGIN ( COLON id:IDENTIFIER )? { generateLoopBodyBegin(g, b, id); }
+      { b = tok(); } K_BEGIN ( COLON { id = tok(); } IDENTIFIER )? { generateLoopBodyBegin(g, b, id); }
       ( generateItem )* K_END { generateLoopBodyEnd(g); }
-    | { generateLoopBodyBegin(g, LT(1), TokenRef()); }
+    | { generateLoopBodyBegin(g, tok(), Tn_VerilogTok()); }
       a=attributeInstances moduleOrGenerateItem[a] { generateLoopBodyEnd(g); }
       )
     ;
 
 generateIf returns [Tn_VerilogGenerateStatement* g = 0]
-{ Nest nest(*this); Tn_VerilogExpression* c = 0; Tn_VerilogGenerateStatement* b = 0; }
-    : t:K_IF LPAREN c=constantExpression RPAREN { g = makeGenerateIf(t, c); }
+{ Tn_VerilogTok t; Nest nest(*this); Tn_VerilogExpression* c = 0; Tn_VerilogGenerateStatement* b = 0; }
+    : { t = tok(); } K_IF LPAREN c=constantExpression RPAREN { g = makeGenerateIf(t, c); }
       b=generateBranch { generateIfBranch(g, b, true); }
       ( options { greedy = true; } : K_ELSE b=generateBranch { generateIfBranch(g, b, false); } )?
     ;
 
 generateCase returns [Tn_VerilogGenerateStatement* g = 0]
-{ Nest nest(*this); Tn_VerilogExpression* c = 0; }
-    : t:K_CASE LPAREN c=constantExpression RPAREN { g = makeGenerateCase(t, c); }
+{ Tn_VerilogTok t; Nest nest(*this); Tn_VerilogExpression* c = 0; }
+    : { t = tok(); } K_CASE LPAREN c=constantExpression RPAREN { g = makeGenerateCase(t, c); }
       ( generateCaseItem[g] )+
       K_ENDCASE
     ;
 
 generateCaseItem[Tn_VerilogGenerateStatement* g]
-{ Tn_VerilogGenerateStatement* i = 0; Tn_VerilogGenerateStatement* b = 0; Tn_VerilogExpression* e = 0; }
-    : d:K_DEFAULT ( COLON )? { i = generateCaseItemBegin(g, d); } b=generateBranch { generateCaseItemBody(i, b); }
-    | { i = generateCaseItemBegin(g, LT(1)); }
+{ Tn_VerilogTok d; Tn_VerilogGenerateStatement* i = 0; Tn_VerilogGenerateStatement* b = 0; Tn_VerilogExpression* e = 0; }
+    : { d = tok(); } K_DEFAULT ( COLON )? { i = generateCaseItemBegin(g, d); } b=generateBranch { generateCaseItemBody(i, b); }
+    | { i = generateCaseItemBegin(g, tok()); }
       e=constantExpression { generateCaseItemExpression(i, e); }
       ( COMMA e=constantExpression { generateCaseItemExpression(i, e); } )*
       COLON b=generateBranch { generateCaseItemBody(i, b); }
@@ -597,104 +605,108 @@ generateCaseItem[Tn_VerilogGenerateStatement* g]
 // One branch of a generate if or case: nothing, a nested construct, a block
 // or a single item.
 generateBranch returns [Tn_VerilogGenerateStatement* g = 0]
-{ Nest nest(*this); Tn_VerilogAttributes* a = 0; }
+{ Tn_VerilogTok b, id; Nest nest(*this); Tn_VerilogAttributes* a = 0; }
     : ( options { generateAmbigWarnings = false; } :
         SEMI
       | g=generateIf
       | g=generateCase
       | g=generateFor
-      | b:K_BEGIN ( COLON id:IDENTIFIER )? { g = generateBlockBegin(b, id); }
+      | { b = tok(); } K_BEGIN ( COLON { id = tok(); } IDENTIFIER )? { g = generateBlockBegin(b, id); }
         ( generateItem )* K_END { generateBlockEnd(g); }
-      | { g = generateBlockBegin(LT(1), TokenRef()); } a=attributeInstances moduleOrGenerateItem[a] { generateBlockEnd(g); }
+      | { g = generateBlockBegin(tok(), Tn_VerilogTok()); } a=attributeInstances moduleOrGenerateItem[a] { generateBlockEnd(g); }
       )
     ;
 
 // --------------------------------------------------------------- UDPs
 
 udpDeclaration[Tn_VerilogAttributes* a]
-    : t:K_PRIMITIVE id:IDENTIFIER { udpBegin(t, id, a); }
+{ Tn_VerilogTok t, id, p, p2, e; }
+    : { t = tok(); } K_PRIMITIVE { id = tok(); } IDENTIFIER { udpBegin(t, id, a); }
       LPAREN
       ( { v2001() && isAnsiPortStart(LA(1)) }? udpAnsiPorts
-      | p:IDENTIFIER { udpPort(p); } ( COMMA p2:IDENTIFIER { udpPort(p2); } )*
+      | { p = tok(); } IDENTIFIER { udpPort(p); } ( COMMA { p2 = tok(); } IDENTIFIER { udpPort(p2); } )*
       )
       RPAREN SEMI
       ( udpDeclarationItem )*
       ( udpInitial )?
       udpTable
-      e:K_ENDPRIMITIVE { udpEnd(e); }
+      { e = tok(); } K_ENDPRIMITIVE { udpEnd(e); }
     ;
 
 udpAnsiPorts
-{ Tn_VerilogDeclSpec s; }
+{ Tn_VerilogTok id; Tn_VerilogDeclSpec s; }
     : udpAnsiPort[s]
       ( options { greedy = true; } :
-        COMMA ( id:IDENTIFIER { udpPort(id); declarePort(s, id, 0); } | udpAnsiPort[s] )
+        COMMA ( { id = tok(); } IDENTIFIER { udpPort(id); declarePort(s, id, 0); } | udpAnsiPort[s] )
       )*
     ;
 
 udpAnsiPort[Tn_VerilogDeclSpec& s]
-{ Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok o, i, id; Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* e = 0; }
     : a=attributeInstances { s = Tn_VerilogDeclSpec(); s.attributes = a; }
-      ( o:K_OUTPUT { s.first = o; s.direction = K_OUTPUT; } ( K_REG { s.kind = Tn_VerilogDeclSpec::REG; } )?
-      | i:K_INPUT { s.first = i; s.direction = K_INPUT; }
+      ( { o = tok(); } K_OUTPUT { s.first = o; s.direction = K_OUTPUT; } ( K_REG { s.kind = Tn_VerilogDeclSpec::REG; } )?
+      | { i = tok(); } K_INPUT { s.first = i; s.direction = K_INPUT; }
       )
-      id:IDENTIFIER ( ASSIGN e=expression )? { udpPort(id); declarePort(s, id, e); }
+      { id = tok(); } IDENTIFIER ( ASSIGN e=expression )? { udpPort(id); declarePort(s, id, e); }
     ;
 
 udpDeclarationItem
-{ Tn_VerilogAttributes* a = 0; Tn_VerilogDeclSpec s; Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok o, id, i, id2, id3, r, id4; Tn_VerilogAttributes* a = 0; Tn_VerilogDeclSpec s; Tn_VerilogExpression* e = 0; }
     : a=attributeInstances { s.attributes = a; }
-      ( o:K_OUTPUT { s.first = o; s.direction = K_OUTPUT; }
+      ( { o = tok(); } K_OUTPUT { s.first = o; s.direction = K_OUTPUT; }
         ( K_REG { s.kind = Tn_VerilogDeclSpec::REG; } )?
-        id:IDENTIFIER ( ASSIGN e=expression )? { declarePort(s, id, e); } SEMI
-      | i:K_INPUT { s.first = i; s.direction = K_INPUT; }
-        id2:IDENTIFIER { declarePort(s, id2, 0); }
-        ( COMMA id3:IDENTIFIER { declarePort(s, id3, 0); } )* SEMI
-      | r:K_REG { s.first = r; s.kind = Tn_VerilogDeclSpec::REG; }
-        id4:IDENTIFIER { declareVariable(s, id4, dimensionsBegin(), 0); } SEMI
+        { id = tok(); } IDENTIFIER ( ASSIGN e=expression )? { declarePort(s, id, e); } SEMI
+      | { i = tok(); } K_INPUT { s.first = i; s.direction = K_INPUT; }
+        { id2 = tok(); } IDENTIFIER { declarePort(s, id2, 0); }
+        ( COMMA { id3 = tok(); } IDENTIFIER { declarePort(s, id3, 0); } )* SEMI
+      | { r = tok(); } K_REG { s.first = r; s.kind = Tn_VerilogDeclSpec::REG; }
+        { id4 = tok(); } IDENTIFIER { declareVariable(s, id4, dimensionsBegin(), 0); } SEMI
       )
     ;
 
 udpInitial
-{ Tn_VerilogExpression* e = 0; }
-    : t:K_INITIAL id:IDENTIFIER ASSIGN e=expression SEMI { udpInitialStatement(t, id, e); }
+{ Tn_VerilogTok t, id; Tn_VerilogExpression* e = 0; }
+    : { t = tok(); } K_INITIAL { id = tok(); } IDENTIFIER ASSIGN e=expression SEMI { udpInitialStatement(t, id, e); }
     ;
 
 udpTable
-    : t:K_TABLE { udpTableBegin(t); } ( udpRow )+ K_ENDTABLE
+{ Tn_VerilogTok t; }
+    : { t = tok(); } K_TABLE { udpTableBegin(t); } ( udpRow )+ K_ENDTABLE
     ;
 
 udpRow
-    : { udpRowBegin(LT(1)); }
+{ Tn_VerilogTok c, c2, e; }
+    : { udpRowBegin(tok()); }
       ( udpInputSymbol )+
-      c:COLON { udpRowColon(c); }
+      { c = tok(); } COLON { udpRowColon(c); }
       ( options { generateAmbigWarnings = false; } :
-        { udpSequential() }? udpLevelSymbol c2:COLON { udpRowColon(c2); } udpOutputSymbol
+        { udpSequential() }? udpLevelSymbol { c2 = tok(); } COLON { udpRowColon(c2); } udpOutputSymbol
       | udpOutputSymbol
       )
-      e:SEMI { udpRowEnd(e); }
+      { e = tok(); } SEMI { udpRowEnd(e); }
     ;
 
 udpInputSymbol
+{ Tn_VerilogTok lp, rp; }
     : udpEdgeSymbol
     | udpLevelSymbol
-    | lp:LPAREN { udpRowEdgeOpen(lp); } ( udpAnySymbol )* rp:RPAREN { udpRowEdgeClose(rp); }
+    | { lp = tok(); } LPAREN { udpRowEdgeOpen(lp); } ( udpAnySymbol )* { rp = tok(); } RPAREN { udpRowEdgeClose(rp); }
     ;
 
 udpLevelSymbol
-    : { udpRowSymbol(LT(1)); } ( UDP_0 | UDP_1 | UDP_X | QUESTION | UDP_B )
+    : { udpRowSymbol(tok()); } ( UDP_0 | UDP_1 | UDP_X | QUESTION | UDP_B )
     ;
 
 udpEdgeSymbol
-    : { udpRowSymbol(LT(1)); } ( UDP_R | UDP_F | UDP_P | UDP_N | STAR )
+    : { udpRowSymbol(tok()); } ( UDP_R | UDP_F | UDP_P | UDP_N | STAR )
     ;
 
 udpOutputSymbol
-    : { udpRowSymbol(LT(1)); } ( UDP_0 | UDP_1 | UDP_X | MINUS )
+    : { udpRowSymbol(tok()); } ( UDP_0 | UDP_1 | UDP_X | MINUS )
     ;
 
 udpAnySymbol
-    : { udpRowSymbol(LT(1)); }
+    : { udpRowSymbol(tok()); }
       ( UDP_0 | UDP_1 | UDP_X | QUESTION | UDP_B | UDP_R | UDP_F | UDP_P | UDP_N | STAR | MINUS )
     ;
 
@@ -717,16 +729,16 @@ specifyItem
 
 pulseControl[Tn_VerilogAttributes* a]
 { Tn_VerilogNode* p = 0; Tn_VerilogExpression* e = 0; }
-    : { p = pulseControlBegin(LT(1), a); }
+    : { p = pulseControlBegin(tok(), a); }
       ( K_PULSESTYLE_ONEVENT | K_PULSESTYLE_ONDETECT | K_SHOWCANCELLED | K_NOSHOWCANCELLED )
       e=name { pulseControlOutput(p, e); } ( COMMA e=name { pulseControlOutput(p, e); } )* SEMI
     ;
 
 pathDeclaration[Tn_VerilogAttributes* a]
-{ Tn_VerilogNode* p = 0; Tn_VerilogExpression* c = 0; }
-    : t:K_IF LPAREN c=expression RPAREN { p = pathBegin(t, a, c, false); } pathDescription[p] pathDelays[p]
-    | n:K_IFNONE { p = pathBegin(n, a, 0, true); } pathDescription[p] pathDelays[p]
-    | { p = pathBegin(LT(1), a, 0, false); } pathDescription[p] pathDelays[p]
+{ Tn_VerilogTok t, n; Tn_VerilogNode* p = 0; Tn_VerilogExpression* c = 0; }
+    : { t = tok(); } K_IF LPAREN c=expression RPAREN { p = pathBegin(t, a, c, false); } pathDescription[p] pathDelays[p]
+    | { n = tok(); } K_IFNONE { p = pathBegin(n, a, 0, true); } pathDescription[p] pathDelays[p]
+    | { p = pathBegin(tok(), a, 0, false); } pathDescription[p] pathDelays[p]
     ;
 
 pathDescription[Tn_VerilogNode* p]
@@ -746,26 +758,26 @@ pathDescription[Tn_VerilogNode* p]
     ;
 
 pathDelays[Tn_VerilogNode* p]
-{ Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogTok s; Tn_VerilogExpression* e = 0; }
     : ASSIGN
       ( options { generateAmbigWarnings = false; } :
         LPAREN e=mintypmaxExpression { pathDelay(p, e); } ( COMMA e=mintypmaxExpression { pathDelay(p, e); } )* RPAREN
       | e=mintypmaxExpression { pathDelay(p, e); } ( COMMA e=mintypmaxExpression { pathDelay(p, e); } )*
       )
-      s:SEMI { pathEnd(p, s); }
+      { s = tok(); } SEMI { pathEnd(p, s); }
     ;
 
 timingCheck[Tn_VerilogAttributes* a]
-{ Tn_VerilogNode* c = 0; }
-    : { c = timingCheckBegin(LT(1), a); }
+{ Tn_VerilogTok rp; Tn_VerilogNode* c = 0; }
+    : { c = timingCheckBegin(tok(), a); }
       ( S_SETUP | S_HOLD | S_SETUPHOLD | S_RECOVERY | S_REMOVAL | S_RECREM
       | S_SKEW | S_TIMESKEW | S_FULLSKEW | S_PERIOD | S_WIDTH | S_NOCHANGE )
-      LPAREN timingCheckArgument[c] ( COMMA timingCheckArgument[c] )* rp:RPAREN SEMI { timingCheckEnd(c, rp); }
+      LPAREN timingCheckArgument[c] ( COMMA timingCheckArgument[c] )* { rp = tok(); } RPAREN SEMI { timingCheckEnd(c, rp); }
     ;
 
 timingCheckArgument[Tn_VerilogNode* c]
 { Tn_VerilogExpression* e = 0; Tn_VerilogExpression* x = 0; int edge = 0; unsigned descriptors = 0; unsigned d = 0;
-  TokenRef where = LT(1); }
+  Tn_VerilogTok where = tok(); }
     : ( ( K_POSEDGE { edge = K_POSEDGE; } | K_NEGEDGE { edge = K_NEGEDGE; }
         | K_EDGE { edge = K_EDGE; } LBRACKET descriptors=edgeDescriptor
           ( COMMA d=edgeDescriptor { descriptors |= d; } )* RBRACKET
@@ -781,7 +793,8 @@ edgeDescriptor returns [unsigned d = 0]
 
 // Any other system task is skipped, its arguments unread.
 invalidSpecifyTask
-    : id:SYSTEM_IDENTIFIER { ignoreSpecifyTask(id); } SEMI
+{ Tn_VerilogTok id; }
+    : { id = tok(); } SYSTEM_IDENTIFIER { ignoreSpecifyTask(id); } SEMI
     ;
 
 // ------------------------------------------------------------- statements
@@ -792,6 +805,7 @@ statement returns [Tn_VerilogStatement* s = 0]
     ;
 
 statementBody[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
+{ Tn_VerilogTok t; }
     : s=assignmentOrTaskCall[a]
     | s=systemTaskCall[a]
     | s=ifStatement[a]
@@ -804,11 +818,11 @@ statementBody[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
     | s=disableStatement[a]
     | s=eventTrigger[a]
     | s=proceduralContinuous[a]
-    | t:SEMI { s = nullStatement(t, a); }
+    | { t = tok(); } SEMI { s = nullStatement(t, a); }
     ;
 
 assignmentOrTaskCall[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* l = 0; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* c = 0; TokenRef t = LT(1); }
+{ Tn_VerilogExpression* l = 0; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* c = 0; Tn_VerilogTok t = tok(); }
     : ( l=name | l=lvalueConcatenation )
       ( ASSIGN ( c=intraAssignmentControl )? e=expression SEMI { s = blockingAssign(t, a, l, c, e); }
       | LE ( c=intraAssignmentControl )? e=expression SEMI { s = nonBlockingAssign(t, a, l, c, e); }
@@ -818,25 +832,25 @@ assignmentOrTaskCall[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 
     ;
 
 systemTaskCall[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* e = 0; }
-    : id:SYSTEM_IDENTIFIER { e = systemCall(id); } ( LPAREN systemArguments[e] RPAREN )? SEMI
+{ Tn_VerilogTok id; Tn_VerilogExpression* e = 0; }
+    : { id = tok(); } SYSTEM_IDENTIFIER { e = systemCall(id); } ( LPAREN systemArguments[e] RPAREN )? SEMI
       { s = systemTask(id, a, e); }
     ;
 
 intraAssignmentControl returns [Tn_VerilogStatement* c = 0]
-{ Tn_VerilogExpression* e = 0; Tn_VerilogStatement* ec = 0; }
-    : t:HASH e=delayControlValue { c = delayControl(t, 0, e, 0); }
+{ Tn_VerilogTok t, r; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* ec = 0; }
+    : { t = tok(); } HASH e=delayControlValue { c = delayControl(t, 0, e, 0); }
     | c=eventControl[0]
-    | r:K_REPEAT LPAREN e=expression RPAREN ec=eventControl[0] { c = repeatControl(r, e, ec); }
+    | { r = tok(); } K_REPEAT LPAREN e=expression RPAREN ec=eventControl[0] { c = repeatControl(r, e, ec); }
     ;
 
 ifStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* c = 0; Tn_VerilogStatement* t = 0; Tn_VerilogStatement* f = 0; size_t m = ifChainBegin(); }
-    : i:K_IF LPAREN c=expression RPAREN t=statement { ifChainAdd(i, a, c, t); }
+{ Tn_VerilogTok i, i2; Tn_VerilogExpression* c = 0; Tn_VerilogStatement* t = 0; Tn_VerilogStatement* f = 0; size_t m = ifChainBegin(); }
+    : { i = tok(); } K_IF LPAREN c=expression RPAREN t=statement { ifChainAdd(i, a, c, t); }
       ( options { greedy = true; } :
         { f == 0 }? K_ELSE
         ( options { generateAmbigWarnings = false; } :
-          i2:K_IF LPAREN c=expression RPAREN t=statement { ifChainAdd(i2, 0, c, t); }
+          { i2 = tok(); } K_IF LPAREN c=expression RPAREN t=statement { ifChainAdd(i2, 0, c, t); }
         | f=statement
         )
       )*
@@ -845,49 +859,49 @@ ifStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
 
 caseStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
 { Tn_VerilogExpression* e = 0; }
-    : { s = caseBegin(LT(1), a); } ( K_CASE | K_CASEZ | K_CASEX )
+    : { s = caseBegin(tok(), a); } ( K_CASE | K_CASEZ | K_CASEX )
       LPAREN e=expression RPAREN { caseSelector(s, e); }
       ( caseItem[s] )+
       K_ENDCASE
     ;
 
 caseItem[Tn_VerilogStatement* c]
-{ Tn_VerilogStatement* i = 0; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* s = 0; }
-    : d:K_DEFAULT ( COLON )? { i = caseItemBegin(c, d); } s=statement { caseItemBody(i, s); }
-    | { i = caseItemBegin(c, LT(1)); }
+{ Tn_VerilogTok d; Tn_VerilogStatement* i = 0; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* s = 0; }
+    : { d = tok(); } K_DEFAULT ( COLON )? { i = caseItemBegin(c, d); } s=statement { caseItemBody(i, s); }
+    | { i = caseItemBegin(c, tok()); }
       e=expression { caseItemExpression(i, e); } ( COMMA e=expression { caseItemExpression(i, e); } )*
       COLON s=statement { caseItemBody(i, s); }
     ;
 
 loopStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* e = 0; Tn_VerilogStatement* b = 0; Tn_VerilogStatement* i = 0; Tn_VerilogStatement* n = 0;
-  Tn_VerilogExpression* l = 0; Tn_VerilogExpression* v = 0; TokenRef at; }
-    : f:K_FOREVER b=statement { s = forever(f, a, b); }
-    | r:K_REPEAT LPAREN e=expression RPAREN b=statement { s = repeat(r, a, e, b); }
-    | w:K_WHILE LPAREN e=expression RPAREN b=statement { s = whileLoop(w, a, e, b); }
-    | t:K_FOR LPAREN
-      { at = LT(1); } l=lvalue ASSIGN v=expression { i = blockingAssign(at, 0, l, 0, v); } SEMI
+{ Tn_VerilogTok f, r, w, t; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* b = 0; Tn_VerilogStatement* i = 0; Tn_VerilogStatement* n = 0;
+  Tn_VerilogExpression* l = 0; Tn_VerilogExpression* v = 0; Tn_VerilogTok at; }
+    : { f = tok(); } K_FOREVER b=statement { s = forever(f, a, b); }
+    | { r = tok(); } K_REPEAT LPAREN e=expression RPAREN b=statement { s = repeat(r, a, e, b); }
+    | { w = tok(); } K_WHILE LPAREN e=expression RPAREN b=statement { s = whileLoop(w, a, e, b); }
+    | { t = tok(); } K_FOR LPAREN
+      { at = tok(); } l=lvalue ASSIGN v=expression { i = blockingAssign(at, 0, l, 0, v); } SEMI
       e=expression SEMI
-      { at = LT(1); } l=lvalue ASSIGN v=expression { n = blockingAssign(at, 0, l, 0, v); } RPAREN
+      { at = tok(); } l=lvalue ASSIGN v=expression { n = blockingAssign(at, 0, l, 0, v); } RPAREN
       b=statement { s = forLoop(t, a, i, e, n, b); }
     ;
 
 block[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-    : { s = blockBegin(LT(1), a); } K_BEGIN blockContents[s] K_END { blockEnd(s); }
-    | { s = blockBegin(LT(1), a); } K_FORK blockContents[s] K_JOIN { blockEnd(s); }
+    : { s = blockBegin(tok(), a); } K_BEGIN blockContents[s] K_END { blockEnd(s); }
+    | { s = blockBegin(tok(), a); } K_FORK blockContents[s] K_JOIN { blockEnd(s); }
     ;
 
 blockContents[Tn_VerilogStatement*& s]
-{ Tn_VerilogStatement* b = 0; }
-    : ( COLON id:IDENTIFIER { s = blockName(s, id); }
+{ Tn_VerilogTok id; Tn_VerilogStatement* b = 0; }
+    : ( COLON { id = tok(); } IDENTIFIER { s = blockName(s, id); }
         ( options { generateAmbigWarnings = false; } : { declarationAhead(false) }? blockDeclaration[false] )*
       )?
       ( b=statement { blockAdd(s, b); } )*
     ;
 
 delayControlStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* e = 0; Tn_VerilogStatement* b = 0; }
-    : t:HASH e=delayControlValue b=statement { s = delayControl(t, a, e, b); }
+{ Tn_VerilogTok t; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* b = 0; }
+    : { t = tok(); } HASH e=delayControlValue b=statement { s = delayControl(t, a, e, b); }
     ;
 
 delayControlValue returns [Tn_VerilogExpression* e = 0]
@@ -902,14 +916,14 @@ eventControlStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s =
     ;
 
 eventControl[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogEventExpression* e = 0; Tn_VerilogExpression* n = 0; }
-    : t:AT
+{ Tn_VerilogTok t, rp; Tn_VerilogEventExpression* e = 0; Tn_VerilogExpression* n = 0; }
+    : { t = tok(); } AT
       ( n=name { s = makeEventControl(t, a, n); }
       | { v2001() }? STAR { s = makeEventControl(t, a, 0); }
       | { v2001() }? ATTR_OPEN RPAREN { s = makeEventControl(t, a, 0); }
       | LPAREN
         ( { v2001() }? STAR RPAREN { s = makeEventControl(t, a, 0); }
-        | rp:RPAREN { s = emptyEventControl(t, a, rp); }
+        | { rp = tok(); } RPAREN { s = emptyEventControl(t, a, rp); }
         | e=eventExpression RPAREN { s = makeEventControl(t, a, e); }
         )
       )
@@ -922,33 +936,33 @@ eventExpression returns [Tn_VerilogEventExpression* e = 0]
     ;
 
 eventTerm returns [Tn_VerilogEventExpression* e = 0]
-{ Tn_VerilogExpression* x = 0; }
-    : p:K_POSEDGE x=expression { e = edgeEvent(p, x); }
-    | n:K_NEGEDGE x=expression { e = edgeEvent(n, x); }
+{ Tn_VerilogTok p, n; Tn_VerilogExpression* x = 0; }
+    : { p = tok(); } K_POSEDGE x=expression { e = edgeEvent(p, x); }
+    | { n = tok(); } K_NEGEDGE x=expression { e = edgeEvent(n, x); }
     | x=expression { e = x; }
     ;
 
 waitStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* e = 0; Tn_VerilogStatement* b = 0; }
-    : t:K_WAIT LPAREN e=expression RPAREN b=statement { s = makeWait(t, a, e, b); }
+{ Tn_VerilogTok t; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* b = 0; }
+    : { t = tok(); } K_WAIT LPAREN e=expression RPAREN b=statement { s = makeWait(t, a, e, b); }
     ;
 
 disableStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* n = 0; }
-    : t:K_DISABLE n=name SEMI { s = disable(t, a, n); }
+{ Tn_VerilogTok t; Tn_VerilogExpression* n = 0; }
+    : { t = tok(); } K_DISABLE n=name SEMI { s = disable(t, a, n); }
     ;
 
 eventTrigger[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* n = 0; }
-    : t:EVENT_TRIGGER n=name SEMI { s = makeEventTrigger(t, a, n); }
+{ Tn_VerilogTok t; Tn_VerilogExpression* n = 0; }
+    : { t = tok(); } EVENT_TRIGGER n=name SEMI { s = makeEventTrigger(t, a, n); }
     ;
 
 proceduralContinuous[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
-{ Tn_VerilogExpression* l = 0; Tn_VerilogExpression* e = 0; }
-    : t:K_ASSIGN l=lvalue ASSIGN e=expression SEMI { s = proceduralAssign(t, a, l, e); }
-    | f:K_FORCE l=lvalue ASSIGN e=expression SEMI { s = proceduralAssign(f, a, l, e); }
-    | d:K_DEASSIGN l=lvalue SEMI { s = proceduralRelease(d, a, l); }
-    | r:K_RELEASE l=lvalue SEMI { s = proceduralRelease(r, a, l); }
+{ Tn_VerilogTok t, f, d, r; Tn_VerilogExpression* l = 0; Tn_VerilogExpression* e = 0; }
+    : { t = tok(); } K_ASSIGN l=lvalue ASSIGN e=expression SEMI { s = proceduralAssign(t, a, l, e); }
+    | { f = tok(); } K_FORCE l=lvalue ASSIGN e=expression SEMI { s = proceduralAssign(f, a, l, e); }
+    | { d = tok(); } K_DEASSIGN l=lvalue SEMI { s = proceduralRelease(d, a, l); }
+    | { r = tok(); } K_RELEASE l=lvalue SEMI { s = proceduralRelease(r, a, l); }
     ;
 
 // ------------------------------------------------------------ expressions
@@ -959,8 +973,8 @@ lvalue returns [Tn_VerilogExpression* e = 0]
     ;
 
 lvalueConcatenation returns [Tn_VerilogExpression* e = 0]
-{ Nest nest(*this); Tn_VerilogExpression* l = 0; }
-    : t:LBRACE l=lvalue { e = makeConcatenation(t, l); } ( COMMA l=lvalue { concatenationAdd(e, l); } )* RBRACE
+{ Tn_VerilogTok t; Nest nest(*this); Tn_VerilogExpression* l = 0; }
+    : { t = tok(); } LBRACE l=lvalue { e = makeConcatenation(t, l); } ( COMMA l=lvalue { concatenationAdd(e, l); } )* RBRACE
     ;
 
 constantExpression returns [Tn_VerilogExpression* e = 0]
@@ -969,23 +983,23 @@ constantExpression returns [Tn_VerilogExpression* e = 0]
     ;
 
 mintypmaxExpression returns [Tn_VerilogExpression* e = 0]
-{ Tn_VerilogExpression* t = 0; Tn_VerilogExpression* m = 0; }
-    : e=expression ( c:COLON t=expression COLON m=expression { e = minTypMax(c, e, t, m); } )?
+{ Tn_VerilogTok c; Tn_VerilogExpression* t = 0; Tn_VerilogExpression* m = 0; }
+    : e=expression ( { c = tok(); } COLON t=expression COLON m=expression { e = minTypMax(c, e, t, m); } )?
     ;
 
 // Conditional operators to the right of the colon continue the loop, so
 // that a chain of them does not recurse.
 expression returns [Tn_VerilogExpression* e = 0]
-{ Nest nest(*this); Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* t = 0; size_t m = conditionalBegin(); }
+{ Tn_VerilogTok q; Nest nest(*this); Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* t = 0; size_t m = conditionalBegin(); }
     : e=binaryExpression
-      ( q:QUESTION a=attributeInstances t=expression COLON { conditionalAdd(q, a, e, t); } e=binaryExpression )*
+      ( { q = tok(); } QUESTION a=attributeInstances t=expression COLON { conditionalAdd(q, a, e, t); } e=binaryExpression )*
       { e = conditionalEnd(m, e); }
     ;
 
 binaryExpression returns [Tn_VerilogExpression* e = 0]
-{ Tn_VerilogAttributes* a = 0; size_t m = binaryBegin(); TokenRef op; }
+{ Tn_VerilogAttributes* a = 0; size_t m = binaryBegin(); Tn_VerilogTok op; }
     : e=unaryExpression
-      ( { binaryOperand(e); op = LT(1); }
+      ( { binaryOperand(e); op = tok(); }
         ( LOGICAL_OR | LOGICAL_AND | BIT_OR | CARET | XNOR | AMPERSAND
         | EQUAL | NOT_EQUAL | CASE_EQUAL | CASE_NOT_EQUAL
         | LESS_THAN | LE | GT | GE | SHIFT_LEFT | SHIFT_RIGHT | ASHIFT_LEFT | ASHIFT_RIGHT
@@ -998,8 +1012,8 @@ binaryExpression returns [Tn_VerilogExpression* e = 0]
     ;
 
 unaryExpression returns [Tn_VerilogExpression* e = 0]
-{ Tn_VerilogAttributes* a = 0; size_t m = unaryBegin(); TokenRef op; }
-    : ( { op = LT(1); }
+{ Tn_VerilogAttributes* a = 0; size_t m = unaryBegin(); Tn_VerilogTok op; }
+    : ( { op = tok(); }
         ( PLUS | MINUS | LOGICAL_NOT | TILDE | AMPERSAND | REDUCE_NAND | CARET | XNOR | BIT_OR | REDUCE_NOR )
         a=attributeInstances { unaryOperator(op, a); }
       )*
@@ -1007,18 +1021,19 @@ unaryExpression returns [Tn_VerilogExpression* e = 0]
     ;
 
 primary returns [Tn_VerilogExpression* e = 0]
+{ Tn_VerilogTok s, id; }
     : e=number
-    | s:STRING { e = stringConstant(s); }
+    | { s = tok(); } STRING { e = stringConstant(s); }
     | e=concatenation
     | LPAREN e=mintypmaxExpression RPAREN
-    | id:SYSTEM_IDENTIFIER { e = systemCall(id); } ( LPAREN systemArguments[e] RPAREN )?
+    | { id = tok(); } SYSTEM_IDENTIFIER { e = systemCall(id); } ( LPAREN systemArguments[e] RPAREN )?
     | e=nameOrCall
     ;
 
 nameOrCall returns [Tn_VerilogExpression* e = 0]
-{ Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* x = 0; }
+{ Tn_VerilogTok lp; Tn_VerilogAttributes* a = 0; Tn_VerilogExpression* x = 0; }
     : e=name
-      ( a=attributeInstances lp:LPAREN { e = functionCall(lp, a, e); }
+      ( a=attributeInstances { lp = tok(); } LPAREN { e = functionCall(lp, a, e); }
         ( x=expression { callArgument(e, x); } ( COMMA x=expression { callArgument(e, x); } )* )?
         RPAREN
       )?
@@ -1028,13 +1043,13 @@ nameOrCall returns [Tn_VerilogExpression* e = 0]
 systemArguments[Tn_VerilogExpression* c]
 { Tn_VerilogExpression* x = 0; }
     : { LA(1) == RPAREN }?
-    | ( x=expression { systemArgument(c, x, LT(1)); } | { systemArgument(c, 0, LT(1)); } )
-      ( COMMA { x = 0; } ( x=expression )? { systemArgument(c, x, LT(1)); } )*
+    | ( x=expression { systemArgument(c, x, tok()); } | { systemArgument(c, 0, tok()); } )
+      ( COMMA { x = 0; } ( x=expression )? { systemArgument(c, x, tok()); } )*
     ;
 
 concatenation returns [Tn_VerilogExpression* e = 0]
-{ Nest nest(*this); Tn_VerilogExpression* x = 0; }
-    : t:LBRACE x=expression
+{ Tn_VerilogTok t; Nest nest(*this); Tn_VerilogExpression* x = 0; }
+    : { t = tok(); } LBRACE x=expression
       ( LBRACE { e = multipleConcatenation(t, x); }
         x=expression { concatenationAdd(e, x); } ( COMMA x=expression { concatenationAdd(e, x); } )* RBRACE
       | { e = makeConcatenation(t, x); } ( COMMA x=expression { concatenationAdd(e, x); } )*
@@ -1044,16 +1059,16 @@ concatenation returns [Tn_VerilogExpression* e = 0]
 
 // A simple or hierarchical name with its selects.
 name returns [Tn_VerilogExpression* e = 0]
-{ size_t m = nameBegin(); }
-    : id:IDENTIFIER { nameComponent(id); }
+{ Tn_VerilogTok id, id2; size_t m = nameBegin(); }
+    : { id = tok(); } IDENTIFIER { nameComponent(id); }
       ( select )*
-      ( DOT id2:IDENTIFIER { nameComponent(id2); } ( select )* )*
+      ( DOT { id2 = tok(); } IDENTIFIER { nameComponent(id2); } ( select )* )*
       { e = nameEnd(m); }
     ;
 
 select
-{ Tn_VerilogExpression* b = 0; Tn_VerilogExpression* w = 0; }
-    : t:LBRACKET b=expression
+{ Tn_VerilogTok t; Tn_VerilogExpression* b = 0; Tn_VerilogExpression* w = 0; }
+    : { t = tok(); } LBRACKET b=expression
       ( COLON w=expression { nameSelect(t, COLON, b, w); }
       | { v2001() }? PLUS_COLON w=expression { nameSelect(t, PLUS_COLON, b, w); }
       | { v2001() }? MINUS_COLON w=expression { nameSelect(t, MINUS_COLON, b, w); }
@@ -1063,15 +1078,16 @@ select
     ;
 
 number returns [Tn_VerilogExpression* e = 0]
-    : i:INTEGER ( options { generateAmbigWarnings = false; } : e=basedNumber[i] | { e = integerConstant(i); } )
-    | e=basedNumber[TokenRef()]
-    | r:REAL { e = realConstant(r); }
+{ Tn_VerilogTok i, r; }
+    : { i = tok(); } INTEGER ( options { generateAmbigWarnings = false; } : e=basedNumber[i] | { e = integerConstant(i); } )
+    | e=basedNumber[Tn_VerilogTok()]
+    | { r = tok(); } REAL { e = realConstant(r); }
     ;
 
-basedNumber[TokenRef size] returns [Tn_VerilogExpression* e = 0]
-{ TokenRef b = LT(1); }
-    : ( BASE_D | BASE_SD ) d:DECIMAL_NUMBER { e = basedConstant(size, b, d); }
-    | ( BASE_B | BASE_SB ) bn:BINARY_NUMBER { e = basedConstant(size, b, bn); }
-    | ( BASE_O | BASE_SO ) o:OCTAL_NUMBER { e = basedConstant(size, b, o); }
-    | ( BASE_H | BASE_SH ) h:HEX_NUMBER { e = basedConstant(size, b, h); }
+basedNumber[Tn_VerilogTok size] returns [Tn_VerilogExpression* e = 0]
+{ Tn_VerilogTok d, bn, o, h; Tn_VerilogTok b = tok(); }
+    : ( BASE_D | BASE_SD ) { d = tok(); } DECIMAL_NUMBER { e = basedConstant(size, b, d); }
+    | ( BASE_B | BASE_SB ) { bn = tok(); } BINARY_NUMBER { e = basedConstant(size, b, bn); }
+    | ( BASE_O | BASE_SO ) { o = tok(); } OCTAL_NUMBER { e = basedConstant(size, b, o); }
+    | ( BASE_H | BASE_SH ) { h = tok(); } HEX_NUMBER { e = basedConstant(size, b, h); }
     ;

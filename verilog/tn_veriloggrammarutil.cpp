@@ -1,10 +1,71 @@
 #include "verilog/tn_veriloggrammarutil.h"
 
 #include <cstring>
+#include <vector>
 
+#include "verilog/tn_verilogtoken.h"
 #include "verilog/tn_verilogtokentypes.h"
 
 typedef Tn_VerilogTokenTypes T;
+
+namespace {
+
+// Tokens whose text is their own: every other token's text is fixed.
+bool ownTextOf(int type) {
+    return type >= T::INTEGER || type == 0 || (type >= T::BASE_D && type <= T::BASE_SH);
+}
+
+const char* fixedText(int type) {
+    static const char* const texts[] = {"", "EOF", "", "",
+#define TN_TOKEN(name, text, kind) text,
+#include "verilog/tn_verilogtokens.def"
+#undef TN_TOKEN
+    };
+    return type >= 0 && type < static_cast<int>(sizeof texts / sizeof texts[0]) ? texts[type] : "";
+}
+
+// The fixed texts as symbols, interned once.
+const Tn_Symbol& fixedSymbol(int type) {
+    static std::vector<Tn_Symbol> symbols;
+    static const Tn_Symbol none;
+    if (symbols.empty())
+        for (int k = 0; k < T::TN_TOKEN_LIMIT_; ++k) symbols.push_back(Tn_Symbol(fixedText(k)));
+    return type >= 0 && type < T::TN_TOKEN_LIMIT_ ? symbols[static_cast<size_t>(type)] : none;
+}
+
+}  // namespace
+
+bool Tn_VerilogGrammarUtil::ownText(int type) { return ownTextOf(type); }
+
+TokenRef Tn_VerilogGrammarUtil::lookaheadToken(unsigned int i) {
+    if (i > ahead_.count) fillLookahead(i);
+    Slot& s = ahead_.at(i);
+    if (!s.token) {
+        if (!s.hasText) s.text.assign(fixedText(s.type));
+        s.token = TokenRef(new Tn_VerilogToken(s.type, s.text, s.file, s.line, s.column));
+    }
+    return s.token;
+}
+
+void Tn_VerilogGrammarUtil::clearLookahead() {
+    for (Slot& s : ahead_.slots) s.token = TokenRef();
+    ahead_.head = ahead_.count = 0;
+}
+
+Tn_VerilogTok Tn_VerilogGrammarUtil::tok() {
+    if (ahead_.count == 0) fillLookahead(1);
+    const Slot& s = ahead_.at(1);
+    Tn_VerilogTok t;
+    t.type = s.type;
+    t.text = s.hasText ? Tn_Symbol(s.text.data(), s.text.size()) : fixedSymbol(s.type);
+    if (s.file.get() != lastFile_.get()) {
+        lastFile_ = s.file;
+        lastFileSymbol_ = s.file ? Tn_Symbol(s.file->str().data(), s.file->str().size()) : Tn_Symbol();
+    }
+    t.location = Tn_Location(lastFileSymbol_, s.line);
+    t.column = s.column;
+    return t;
+}
 
 Tn_VerilogGrammarUtil::~Tn_VerilogGrammarUtil() {}
 
@@ -50,8 +111,8 @@ bool Tn_VerilogGrammarUtil::isBlockDeclaration(int type, bool ports) {
 }
 
 // PATHPULSE$ specparams take a pulse limit pair.
-bool Tn_VerilogGrammarUtil::isPulseControlName(const TokenRef& id) {
-    return id && std::strncmp(id->getText().c_str(), "PATHPULSE$", 10) == 0;
+bool Tn_VerilogGrammarUtil::isPulseControlName(const Tn_VerilogTok& id) {
+    return std::strncmp(id.text.c_str(), "PATHPULSE$", 10) == 0;
 }
 
 unsigned Tn_VerilogGrammarUtil::edgeDescriptorBit(int type) {

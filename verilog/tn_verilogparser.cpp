@@ -24,24 +24,7 @@ namespace V = Tn_Verilog;
 
 namespace {
 
-// Tokens whose text is their own: every other token's text is fixed.
-bool ownText(int type) {
-    typedef Tn_VerilogTokenTypes T;
-    return type >= T::INTEGER || type == 0 || (type >= T::BASE_D && type <= T::BASE_SH);
-}
-
-const char* fixedText(int type) {
-    static const char* const texts[] = {"", "EOF", "", "",
-#define TN_TOKEN(name, text, kind) text,
-#include "verilog/tn_verilogtokens.def"
-#undef TN_TOKEN
-    };
-    return type >= 0 && type < static_cast<int>(sizeof texts / sizeof texts[0]) ? texts[type] : "";
-}
-
-Tn_VerilogToken* tokenOf(const TokenRef& t) { return static_cast<Tn_VerilogToken*>(t.get()); }
-int typeOf(const TokenRef& t) { return t ? t->getType() : 0; }
-const std::string& textOf(const TokenRef& t) { return tokenOf(t)->textRef(); }
+const std::string& textOf(const Tn_VerilogTok& t) { return t.text.str().str(); }
 
 // Nesting or a node tree deeper than the parser allows: ends the parse like
 // a syntax error, at the token where it was found.
@@ -55,9 +38,8 @@ public:
 };
 
 // A syntax error found by a hook: a recognition exception at a token.
-antlr::RecognitionException syntaxError(const TokenRef& t, const std::string& message) {
-    return antlr::RecognitionException(message, t ? t->getFilename() : std::string(), t ? t->getLine() : 0,
-                                       t ? t->getColumn() : 0);
+antlr::RecognitionException syntaxError(const Tn_VerilogTok& t, const std::string& message) {
+    return antlr::RecognitionException(message, t.location.file.c_str(), t.location.line, t.column);
 }
 
 struct BinaryOperator {
@@ -332,38 +314,38 @@ struct Tn_VerilogParser::Impl {
         Port_String netType;
     };
     struct Operator {
-        TokenRef token;
+        Tn_VerilogTok token;
         Tn_VerilogAttributes* attributes;
         BinaryOperator op;
     };
     struct UnaryItem {
-        TokenRef token;
+        Tn_VerilogTok token;
         Tn_VerilogAttributes* attributes;
     };
     struct ConditionalItem {
-        TokenRef token;
+        Tn_VerilogTok token;
         Tn_VerilogAttributes* attributes;
         Tn_VerilogExpression* condition;
         Tn_VerilogExpression* value;
     };
     struct IfItem {
-        TokenRef token;
+        Tn_VerilogTok token;
         Tn_VerilogAttributes* attributes;
         Tn_VerilogExpression* condition;
         Tn_VerilogStatement* statement;
     };
     struct NamePart {
-        TokenRef id;
+        Tn_VerilogTok id;
         size_t selects;  // first select of this component
     };
     struct Select {
-        TokenRef bracket;
+        Tn_VerilogTok bracket;
         int kind;  // 0, COLON, PLUS_COLON, MINUS_COLON
         Tn_VerilogExpression* e1;
         Tn_VerilogExpression* e2;
     };
     struct TimingArgument {
-        TokenRef where;
+        Tn_VerilogTok where;
         int edge;
         unsigned descriptors;
         Tn_VerilogExpression* e;
@@ -411,7 +393,7 @@ struct Tn_VerilogParser::Impl {
     std::vector<UdpPort> udpPorts;
     bool udpHasInitial = false;
     Tn_VerilogUdpTable table;
-    TokenRef rowStart;
+    Tn_VerilogTok rowStart;
 
     // Working stacks of the iterative rules (shared by nested rules through
     // the marks they return).
@@ -425,7 +407,7 @@ struct Tn_VerilogParser::Impl {
     std::vector<NamePart> nameParts;
     std::vector<Select> selects;
     std::vector<TimingArgument> timingArguments;
-    TokenRef timingKeyword;
+    Tn_VerilogTok timingKeyword;
     V::EdgeType pathEdge = V::NoEdge;
     // Binary operator stack bases of the expressions being read.
     std::vector<size_t> binaryFrames;
@@ -433,24 +415,6 @@ struct Tn_VerilogParser::Impl {
     // Depth of each expression and statement node built, by node id.
     std::vector<uint16_t> depths;
 
-    // The file symbol of the last token's file.
-    Tn_RCStringPtr lastFile;
-    Tn_Symbol lastFileSymbol;
-
-    Tn_Symbol symbol(const TokenRef& t) {
-        const std::string& s = textOf(t);
-        return Tn_Symbol(s.data(), s.size());
-    }
-    Tn_Location location(const TokenRef& t) {
-        Tn_VerilogToken* k = tokenOf(t);
-        if (!k) return Tn_Location();
-        const Tn_RCStringPtr& f = k->fileRef();
-        if (f.get() != lastFile.get()) {
-            lastFile = f;
-            lastFileSymbol = f ? Tn_Symbol(f->str().data(), f->str().size()) : Tn_Symbol();
-        }
-        return Tn_Location(lastFileSymbol, k->getLine());
-    }
     Tn_VerilogNodeFactory& f() { return *factory; }
     Scope& scope() { return scopes.back(); }
     bool inUnit() const { return !scopes.empty(); }
@@ -495,7 +459,7 @@ void Tn_VerilogParser::fillLookahead(unsigned int i) {
         Slot& s = a.slots[(a.head + a.count) & a.mask];
         s.type = type;
         // Only names, numbers, strings and strays have a text of their own.
-        s.hasText = ownText(type);
+        s.hasText = Tn_VerilogGrammarUtil::ownText(type);
         if (s.hasText) s.text.assign(state.text);
         if (s.file.get() != state.file.get()) s.file = state.file;
         s.line = state.line;
@@ -504,20 +468,6 @@ void Tn_VerilogParser::fillLookahead(unsigned int i) {
     }
 }
 
-TokenRef Tn_VerilogGrammarUtil::lookaheadToken(unsigned int i) {
-    if (i > ahead_.count) fillLookahead(i);
-    Slot& s = ahead_.at(i);
-    if (!s.token) {
-        if (!s.hasText) s.text.assign(fixedText(s.type));
-        s.token = TokenRef(new Tn_VerilogToken(s.type, s.text, s.file, s.line, s.column));
-    }
-    return s.token;
-}
-
-void Tn_VerilogGrammarUtil::clearLookahead() {
-    for (Slot& s : ahead_.slots) s.token = TokenRef();
-    ahead_.head = ahead_.count = 0;
-}
 
 void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn_StringList* compiled) {
     Impl& d = *d_;
@@ -645,7 +595,7 @@ bool Tn_VerilogParser::declarationAhead(bool ports) {
     return isBlockDeclaration(LA(i), ports);
 }
 
-void Tn_VerilogParser::skipConfiguration(const TokenRef&) {
+void Tn_VerilogParser::skipConfiguration(const Tn_VerilogTok&) {
     // Configurations are read past, not built: nothing in Tarn uses them.
     while (LA(1) != K_ENDCONFIG) {
         if (LA(1) == antlr::Token::EOF_TYPE)
@@ -758,7 +708,7 @@ void implicitNets(Impl& d, Tn_VerilogExpression* e) {
 // The type definition of a declaration, made once for all its names.
 Tn_VerilogTypeDef* typeDefOf(Impl& d, Tn_VerilogDeclSpec& s) {
     if (s.typeDef) return s.typeDef;
-    const Tn_Location loc = d.location(s.first);
+    const Tn_Location loc = (s.first).location;
     switch (s.kind) {
     case Tn_VerilogDeclSpec::NET: {
         Tn_VerilogNet* n = d.f().createNet(loc);
@@ -789,9 +739,9 @@ Tn_VerilogTypeDef* typeDefOf(Impl& d, Tn_VerilogDeclSpec& s) {
 
 // A scalar or array variable of the current scope (nets, regs, integers,
 // events...), with the unpacked dimensions collected since dims.
-Tn_VerilogVariable* declareObject(Impl& d, Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims) {
-    const Tn_Symbol name = d.symbol(id);
-    const Tn_Location loc = d.location(id);
+Tn_VerilogVariable* declareObject(Impl& d, Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, size_t dims) {
+    const Tn_Symbol name = id.text;
+    const Tn_Location loc = (id).location;
     Tn_VerilogTypeDef* type = typeDefOf(d, s);
     Tn_VerilogVariable* v;
     if (dims < d.dimensions.size()) {
@@ -816,9 +766,9 @@ V::PortDirectionType directionOf(const Tn_VerilogIODeclaration* io) {
     return V::InoutPort;
 }
 
-Tn_VerilogIODeclaration* makeIO(Impl& d, Tn_VerilogDeclSpec& s, const TokenRef& id, bool tf) {
-    const Tn_Symbol name = d.symbol(id);
-    const Tn_Location loc = d.location(id);
+Tn_VerilogIODeclaration* makeIO(Impl& d, Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, bool tf) {
+    const Tn_Symbol name = id.text;
+    const Tn_Location loc = (id).location;
     Tn_VerilogIODeclaration* io;
     if (s.direction == Tn_VerilogTokenTypes::K_INPUT)
         io = d.f().createInput(loc);
@@ -1052,11 +1002,11 @@ void constantFunctions(Impl& d, Tn_VerilogModule* m) {
 
 }  // namespace
 
-void Tn_VerilogParser::beginModule(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a) {
+void Tn_VerilogParser::beginModule(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
-    const Tn_Location loc = d.location(keyword);
-    checkUnitName(d, name, d.location(id));
+    const Tn_Symbol name = id.text;
+    const Tn_Location loc = (keyword).location;
+    checkUnitName(d, name, (id).location);
     startUnit(d, name, Tn_LibraryUnit::VERILOG_DESIGN_UNIT);
     Tn_VerilogModule* m = named(d.f().createModule(loc), name, d.unit->root());
     m->DefName = name;
@@ -1076,7 +1026,7 @@ void Tn_VerilogParser::beginModule(const TokenRef& keyword, const TokenRef& id, 
     applyPragmas(d);
 }
 
-void Tn_VerilogParser::endModule(const TokenRef&) {
+void Tn_VerilogParser::endModule(const Tn_VerilogTok&) {
     Impl& d = *d_;
     Tn_VerilogModule* m = d.module;
     for (const Impl::PortReference& p : d.portReferences)
@@ -1091,14 +1041,14 @@ void Tn_VerilogParser::endModule(const TokenRef&) {
     finishUnit(d, "Module <%s> compiled\n");
 }
 
-void Tn_VerilogParser::modulePort(const TokenRef& where, const TokenRef& name, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::modulePort(const Tn_VerilogTok& where, const Tn_VerilogTok& name, Tn_VerilogExpression* e) {
     Impl& d = *d_;
     Tn_VerilogModule* m = d.module;
-    Tn_Location loc = name ? d.location(name) : e ? e->location() : d.location(LT(1));
+    Tn_Location loc = name ? (name).location : e ? e->location() : tok().location;
     Tn_VerilogPort* p = d.f().createPort(loc);
     p->Parent = m;
     if (name)
-        p->EffectiveName = d.symbol(name);
+        p->EffectiveName = name.text;
     else if (Tn_VerilogSimpleName* n = Tn_VerilogNode::cast<Tn_VerilogSimpleName>(e))
         p->EffectiveName = n->Name;
     p->Name = p->EffectiveName;
@@ -1109,20 +1059,20 @@ void Tn_VerilogParser::modulePort(const TokenRef& where, const TokenRef& name, T
     (void)where;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::portReferenceName(const TokenRef& id) {
+Tn_VerilogExpression* Tn_VerilogParser::portReferenceName(const Tn_VerilogTok& id) {
     Impl& d = *d_;
     Tn_VerilogExpression* n = simpleName(id);
-    const Tn_Symbol name = d.symbol(id);
+    const Tn_Symbol name = id.text;
     if (d.portIndex.emplace(name, d.portReferences.size()).second)
-        d.portReferences.push_back(Impl::PortReference{name, d.location(id), false});
+        d.portReferences.push_back(Impl::PortReference{name, (id).location, false});
     return n;
 }
 
-void Tn_VerilogParser::udpBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a) {
+void Tn_VerilogParser::udpBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
-    const Tn_Location loc = d.location(keyword);
-    checkUnitName(d, name, d.location(id));
+    const Tn_Symbol name = id.text;
+    const Tn_Location loc = (keyword).location;
+    checkUnitName(d, name, (id).location);
     startUnit(d, name, Tn_LibraryUnit::VERILOG_DESIGN_UNIT_2);
     Tn_VerilogUdpDefn* u = named(d.f().createUdpDefn(loc), name, d.unit->root());
     u->DefName = name;
@@ -1134,9 +1084,9 @@ void Tn_VerilogParser::udpBegin(const TokenRef& keyword, const TokenRef& id, Tn_
     pushScope(d, Impl::UDP, u, nullptr, true);
 }
 
-void Tn_VerilogParser::udpPort(const TokenRef& id) {
+void Tn_VerilogParser::udpPort(const Tn_VerilogTok& id) {
     Impl& d = *d_;
-    d.udpPorts.push_back(Impl::UdpPort{d.symbol(id), d.location(id)});
+    d.udpPorts.push_back(Impl::UdpPort{id.text, (id).location});
 }
 
 namespace {
@@ -1178,12 +1128,12 @@ void udpInitialValue(Impl& d, const Tn_Location& loc, const Tn_Symbol& target, c
 
 }  // namespace
 
-void Tn_VerilogParser::udpInitialStatement(const TokenRef& keyword, const TokenRef& id, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::udpInitialStatement(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogExpression* e) {
     Impl& d = *d_;
-    udpInitialValue(d, d.location(keyword), d.symbol(id), d.location(id), e);
+    udpInitialValue(d, (keyword).location, id.text, (id).location, e);
 }
 
-void Tn_VerilogParser::udpTableBegin(const TokenRef&) {
+void Tn_VerilogParser::udpTableBegin(const Tn_VerilogTok&) {
     Impl& d = *d_;
     Impl::Names* names = d.scope().names;
     for (size_t i = 0; i < d.udpPorts.size(); ++i) {
@@ -1210,17 +1160,17 @@ void Tn_VerilogParser::udpTableBegin(const TokenRef&) {
 
 bool Tn_VerilogParser::udpSequential() { return d_->udp && d_->udp->PrimitiveType == V::Seq; }
 
-void Tn_VerilogParser::udpRowBegin(const TokenRef& first) {
+void Tn_VerilogParser::udpRowBegin(const Tn_VerilogTok& first) {
     d_->rowStart = first;
     d_->table.beginRow();
 }
 
-void Tn_VerilogParser::udpRowSymbol(const TokenRef& symbol) { d_->table.symbol(textOf(symbol)[0]); }
-void Tn_VerilogParser::udpRowEdgeOpen(const TokenRef&) { d_->table.openEdge(); }
-void Tn_VerilogParser::udpRowEdgeClose(const TokenRef&) { d_->table.closeEdge(); }
-void Tn_VerilogParser::udpRowColon(const TokenRef&) { d_->table.colon(); }
+void Tn_VerilogParser::udpRowSymbol(const Tn_VerilogTok& symbol) { d_->table.symbol(textOf(symbol)[0]); }
+void Tn_VerilogParser::udpRowEdgeOpen(const Tn_VerilogTok&) { d_->table.openEdge(); }
+void Tn_VerilogParser::udpRowEdgeClose(const Tn_VerilogTok&) { d_->table.closeEdge(); }
+void Tn_VerilogParser::udpRowColon(const Tn_VerilogTok&) { d_->table.colon(); }
 
-void Tn_VerilogParser::udpRowEnd(const TokenRef& semi) {
+void Tn_VerilogParser::udpRowEnd(const Tn_VerilogTok& semi) {
     Impl& d = *d_;
     std::string text;
     bool edge = false;
@@ -1228,8 +1178,8 @@ void Tn_VerilogParser::udpRowEnd(const TokenRef& semi) {
     const Tn_VerilogUdpTable::Problem problem = d.table.endRow(text, edge, conflict);
     const bool sequential = udpSequential();
     if (sequential && std::count(text.begin(), text.end(), ':') != 2)
-        throw antlr::MismatchedTokenException(getTokenNames(), getNumTokens(), semi, COLON, false, semi->getFilename());
-    const Tn_Location loc = d.location(d.rowStart);
+        throw syntaxError(semi, "expecting \":\", found ';'");
+    const Tn_Location loc = (d.rowStart).location;
     switch (problem) {
     case Tn_VerilogUdpTable::COLUMN_COUNT:
         error(loc, "%sNumber of input columns in table must match number of inputs.\n");
@@ -1253,18 +1203,18 @@ void Tn_VerilogParser::udpRowEnd(const TokenRef& semi) {
     d.udp->TableEntry.push_back(entry);
 }
 
-void Tn_VerilogParser::udpEnd(const TokenRef&) { finishUnit(*d_, "UDP <%s> compiled\n"); }
+void Tn_VerilogParser::udpEnd(const Tn_VerilogTok&) { finishUnit(*d_, "UDP <%s> compiled\n"); }
 
 // ----------------------------------------------------------- declarations
 
-Tn_VerilogAttributes* Tn_VerilogParser::attributesBegin(const TokenRef& open) {
-    return d_->f().createAttributes(d_->location(open));
+Tn_VerilogAttributes* Tn_VerilogParser::attributesBegin(const Tn_VerilogTok& open) {
+    return d_->f().createAttributes((open).location);
 }
 
-void Tn_VerilogParser::attributeAdd(Tn_VerilogAttributes* a, const TokenRef& id, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::attributeAdd(Tn_VerilogAttributes* a, const Tn_VerilogTok& id, Tn_VerilogExpression* e) {
     Impl& d = *d_;
-    Tn_VerilogAttribute* at = d.f().createAttribute(d.location(id));
-    at->Name = d.symbol(id);
+    Tn_VerilogAttribute* at = d.f().createAttribute((id).location);
+    at->Name = id.text;
     at->Expr = e;
     a->Attribute.push_back(at);
 }
@@ -1297,16 +1247,16 @@ bool inUdpPortList(const Impl& d, const Tn_Symbol& name) {
 
 }  // namespace
 
-void Tn_VerilogParser::declarePort(Tn_VerilogDeclSpec& s, const TokenRef& id, Tn_VerilogExpression* init) {
+void Tn_VerilogParser::declarePort(Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, Tn_VerilogExpression* init) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
+    const Tn_Symbol name = id.text;
     switch (d.scope().kind) {
     case Impl::UDP:
         if (!inUdpPortList(d, name))
-            error(d.location(id), "%sUDP declaration '%s' does not appear in the port list.\n", name.c_str());
+            error((id).location, "%sUDP declaration '%s' does not appear in the port list.\n", name.c_str());
         makeIO(d, s, id, false);
         if (s.kind == Tn_VerilogDeclSpec::REG) declareObject(d, s, id, d.dimensions.size());
-        if (init) udpInitialValue(d, d.location(id), name, d.location(id), init);
+        if (init) udpInitialValue(d, (id).location, name, (id).location, init);
         break;
     case Impl::TASK:
     case Impl::FUNCTION: makeIO(d, s, id, true)->TypeDef = typeDefOf(d, s); break;
@@ -1314,7 +1264,7 @@ void Tn_VerilogParser::declarePort(Tn_VerilogDeclSpec& s, const TokenRef& id, Tn
         if (!s.ansi) {
             auto it = d.portIndex.find(name);
             if (it == d.portIndex.end())
-                error(d.location(id), "%sSignal '%s' is not referenced in the module port list\n", name.c_str());
+                error((id).location, "%sSignal '%s' is not referenced in the module port list\n", name.c_str());
             else
                 d.portReferences[it->second].declared = true;
         }
@@ -1326,7 +1276,7 @@ void Tn_VerilogParser::declarePort(Tn_VerilogDeclSpec& s, const TokenRef& id, Tn
             if (init) variableInit(d, v, init);
         }
         if (s.ansi) {
-            Tn_VerilogPort* p = named(d.f().createPort(d.location(id)), name, d.module);
+            Tn_VerilogPort* p = named(d.f().createPort((id).location), name, d.module);
             p->EffectiveName = name;
             p->Index = static_cast<int32_t>(d.module->Port.size());
             p->Direction = directionOf(io);
@@ -1342,38 +1292,38 @@ size_t Tn_VerilogParser::dimensionsBegin() { return d_->dimensions.size(); }
 
 void Tn_VerilogParser::dimensionAdd(Tn_VerilogRange* r) { d_->dimensions.push_back(r); }
 
-void Tn_VerilogParser::declareNet(Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::declareNet(Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, size_t dims, Tn_VerilogExpression* e) {
     Impl& d = *d_;
     declareObject(d, s, id, dims);
     if (!e) return;
-    Tn_VerilogContAssign* a = d.f().createContAssign(d.location(id));
+    Tn_VerilogContAssign* a = d.f().createContAssign((id).location);
     a->Target = simpleName(id);
     a->Source = e;
     a->DriveStrength = s.strength;
     d.scope().concurrent->ContAssign.push_back(a);
 }
 
-void Tn_VerilogParser::declareVariable(Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims,
+void Tn_VerilogParser::declareVariable(Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, size_t dims,
                                        Tn_VerilogExpression* e) {
     Impl& d = *d_;
-    if (d.scope().kind == Impl::UDP && !inUdpPortList(d, d.symbol(id)))
-        error(d.location(id), "%sUDP declaration '%s' does not appear in the port list.\n", d.symbol(id).c_str());
+    if (d.scope().kind == Impl::UDP && !inUdpPortList(d, id.text))
+        error((id).location, "%sUDP declaration '%s' does not appear in the port list.\n", id.text.c_str());
     Tn_VerilogVariable* v = declareObject(d, s, id, dims);
     if (e) variableInit(d, v, e);
 }
 
-void Tn_VerilogParser::declareGenvar(const TokenRef& id, Tn_VerilogAttributes* a) {
+void Tn_VerilogParser::declareGenvar(const Tn_VerilogTok& id, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
-    Tn_VerilogGenVar* g = named(d.f().createGenVar(d.location(id)), name, d.scope().region);
+    const Tn_Symbol name = id.text;
+    Tn_VerilogGenVar* g = named(d.f().createGenVar((id).location), name, d.scope().region);
     g->Attributes = a;
-    if (declareName(d, g, name, d.location(id))) d.scope().concurrent->GenVar.push_back(g);
+    if (declareName(d, g, name, (id).location)) d.scope().concurrent->GenVar.push_back(g);
 }
 
-void Tn_VerilogParser::declareParameter(Tn_VerilogParamSpec& s, const TokenRef& id, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::declareParameter(Tn_VerilogParamSpec& s, const Tn_VerilogTok& id, Tn_VerilogExpression* e) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
-    const Tn_Location loc = d.location(id);
+    const Tn_Symbol name = id.text;
+    const Tn_Location loc = (id).location;
     if (s.specparam) {
         Tn_VerilogSpecParam* p = named(d.f().createSpecParam(loc), name, d.scope().region);
         p->DeclType = s.range ? V::UnsignedParam : V::NoTypeNoRangeParam;
@@ -1384,7 +1334,7 @@ void Tn_VerilogParser::declareParameter(Tn_VerilogParamSpec& s, const TokenRef& 
         return;
     }
     if (!v2001() && s.range) {
-        warning(d.location(s.first ? s.first : id), "%sRange specification in parameter declaration ignored\n");
+        warning((s.first ? s.first : id).location, "%sRange specification in parameter declaration ignored\n");
         s.range = nullptr;
     }
     Tn_VerilogParameter* p = named(d.f().createParameter(loc), name, d.scope().region);
@@ -1405,16 +1355,16 @@ void Tn_VerilogParser::declareParameter(Tn_VerilogParamSpec& s, const TokenRef& 
     if (declareName(d, p, name, loc)) d.scope().region->Parameter.push_back(p);
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::pulseLimits(const TokenRef& paren, Tn_VerilogExpression* reject,
+Tn_VerilogExpression* Tn_VerilogParser::pulseLimits(const Tn_VerilogTok& paren, Tn_VerilogExpression* reject,
                                                    Tn_VerilogExpression* err) {
     Impl& d = *d_;
-    Tn_VerilogListOp* l = d.f().createListOp(d.location(paren));
+    Tn_VerilogListOp* l = d.f().createListOp((paren).location);
     l->Operand.push_back(reject);
     l->Operand.push_back(err);
     return deep(d, l, {reject, err});
 }
 
-void Tn_VerilogParser::defparam(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
+void Tn_VerilogParser::defparam(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
                                 Tn_VerilogExpression* value) {
     Impl& d = *d_;
     Tn_VerilogName* n = Tn_VerilogNode::cast<Tn_VerilogName>(target);
@@ -1427,8 +1377,8 @@ void Tn_VerilogParser::defparam(const TokenRef& keyword, Tn_VerilogAttributes* a
     d.scope().concurrent->DefParam.push_back(p);
 }
 
-Tn_VerilogDriveStrength* Tn_VerilogParser::driveStrengthBegin(const TokenRef& paren) {
-    Tn_VerilogDriveStrength* s = d_->f().createDriveStrength(d_->location(paren));
+Tn_VerilogDriveStrength* Tn_VerilogParser::driveStrengthBegin(const Tn_VerilogTok& paren) {
+    Tn_VerilogDriveStrength* s = d_->f().createDriveStrength((paren).location);
     s->DriveStrength0 = V::Strong;
     s->DriveStrength1 = V::Strong;
     return s;
@@ -1449,16 +1399,16 @@ void Tn_VerilogParser::driveStrengthAdd(Tn_VerilogDriveStrength* s, int keyword)
     }
 }
 
-Tn_VerilogRange* Tn_VerilogParser::makeRange(const TokenRef& bracket, Tn_VerilogExpression* msb,
+Tn_VerilogRange* Tn_VerilogParser::makeRange(const Tn_VerilogTok& bracket, Tn_VerilogExpression* msb,
                                              Tn_VerilogExpression* lsb) {
     Impl& d = *d_;
-    Tn_VerilogRange* r = d.f().createRange(d.location(bracket));
+    Tn_VerilogRange* r = d.f().createRange((bracket).location);
     r->Msb = msb;
     r->Lsb = lsb;
     return deep(d, r, {msb, lsb});
 }
 
-Tn_VerilogDelay* Tn_VerilogParser::delayBegin(const TokenRef& hash) { return d_->f().createDelay(d_->location(hash)); }
+Tn_VerilogDelay* Tn_VerilogParser::delayBegin(const Tn_VerilogTok& hash) { return d_->f().createDelay((hash).location); }
 
 void Tn_VerilogParser::delayAdd(Tn_VerilogDelay* dl, Tn_VerilogExpression* e) {
     if (!dl->Delay1)
@@ -1472,7 +1422,7 @@ void Tn_VerilogParser::delayAdd(Tn_VerilogDelay* dl, Tn_VerilogExpression* e) {
 
 // ------------------------------------------------------------ module items
 
-void Tn_VerilogParser::contAssign(const TokenRef&, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s,
+void Tn_VerilogParser::contAssign(const Tn_VerilogTok&, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s,
                                   Tn_VerilogDelay* dl, Tn_VerilogExpression* target, Tn_VerilogExpression* source) {
     Impl& d = *d_;
     Tn_VerilogContAssign* c = d.f().createContAssign(target->location());
@@ -1485,11 +1435,11 @@ void Tn_VerilogParser::contAssign(const TokenRef&, Tn_VerilogAttributes* a, Tn_V
     if (v2001()) implicitNets(d, target);
 }
 
-Tn_VerilogNode* Tn_VerilogParser::gateBegin(Tn_VerilogInstSpec& s, const TokenRef& id, Tn_VerilogRange* r,
-                                            const TokenRef& paren) {
+Tn_VerilogNode* Tn_VerilogParser::gateBegin(Tn_VerilogInstSpec& s, const Tn_VerilogTok& id, Tn_VerilogRange* r,
+                                            const Tn_VerilogTok& paren) {
     Impl& d = *d_;
-    const Tn_Location loc = d.location(s.count == 0 ? s.first : id ? id : paren);
-    const Tn_Symbol name = id ? d.symbol(id) : Tn_Symbol();
+    const Tn_Location loc = (s.count == 0 ? s.first : id ? id : paren).location;
+    const Tn_Symbol name = id ? id.text : Tn_Symbol();
     Tn_VerilogConcurrentRegion* region = d.scope().concurrent;
     ++s.count;
     Tn_VerilogPrimitive* p = named(d.f().createPrimitive(loc), name, region);
@@ -1543,11 +1493,11 @@ void Tn_VerilogParser::gateEnd(Tn_VerilogInstSpec& s, Tn_VerilogNode* gate) {
 
 size_t Tn_VerilogParser::parameterValuesBegin() { return d_->parameterValues.size(); }
 
-void Tn_VerilogParser::paramValue(Tn_VerilogInstSpec&, const TokenRef& name, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::paramValue(Tn_VerilogInstSpec&, const Tn_VerilogTok& name, Tn_VerilogExpression* e) {
     Impl& d = *d_;
     Tn_VerilogParamAssignment* p =
-        d.f().createParamAssignment(name ? d.location(name) : e ? e->location() : d.location(LT(1)));
-    if (name) p->Name = d.symbol(name);
+        d.f().createParamAssignment(name ? (name).location : e ? e->location() : tok().location);
+    if (name) p->Name = name.text;
     p->Value = e;
     p->NamedParamAssignmentFlag = bool(name);
     d.parameterValues.push_back(p);
@@ -1581,14 +1531,14 @@ void uselib(Impl& d, Tn_VerilogModuleInstance* inst) {
 
 }  // namespace
 
-Tn_VerilogNode* Tn_VerilogParser::instanceBegin(Tn_VerilogInstSpec& s, const TokenRef& id, Tn_VerilogRange* r,
-                                                const TokenRef& paren) {
+Tn_VerilogNode* Tn_VerilogParser::instanceBegin(Tn_VerilogInstSpec& s, const Tn_VerilogTok& id, Tn_VerilogRange* r,
+                                                const Tn_VerilogTok& paren) {
     Impl& d = *d_;
-    const Tn_Location loc = d.location(s.count == 0 ? s.first : id ? id : paren);
-    const Tn_Symbol name = id ? d.symbol(id) : Tn_Symbol();
+    const Tn_Location loc = (s.count == 0 ? s.first : id ? id : paren).location;
+    const Tn_Symbol name = id ? id.text : Tn_Symbol();
     Tn_VerilogConcurrentRegion* region = d.scope().concurrent;
     Tn_VerilogModuleInstance* inst = named(d.f().createModuleInstance(loc), name, region);
-    inst->DefName = d.symbol(s.first);
+    inst->DefName = s.first.text;
     inst->Attributes = s.attributes;
     // Every instance of the statement has the values written once; the
     // first takes the nodes, the others copies.
@@ -1615,12 +1565,12 @@ Tn_VerilogNode* Tn_VerilogParser::instanceBegin(Tn_VerilogInstSpec& s, const Tok
     return inst;
 }
 
-void Tn_VerilogParser::connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a, const TokenRef& where,
-                                  const TokenRef& name, Tn_VerilogExpression* e) {
+void Tn_VerilogParser::connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a, const Tn_VerilogTok& where,
+                                  const Tn_VerilogTok& name, Tn_VerilogExpression* e) {
     Impl& d = *d_;
     Tn_VerilogPortConnection* c =
-        d.f().createPortConnection(name ? d.location(name) : e ? e->location() : d.location(where));
-    if (name) c->Name = d.symbol(name);
+        d.f().createPortConnection(name ? (name).location : e ? e->location() : (where).location);
+    if (name) c->Name = name.text;
     c->Value = e;
     c->NamedPortConnectionFlag = bool(name);
     c->Attributes = a;
@@ -1633,56 +1583,56 @@ void Tn_VerilogParser::connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a,
 
 void Tn_VerilogParser::instantiationEnd(Tn_VerilogInstSpec& s) { d_->parameterValues.resize(s.paramsBegin); }
 
-void Tn_VerilogParser::process(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) {
+void Tn_VerilogParser::process(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) {
     Impl& d = *d_;
     Tn_VerilogProcess* p;
-    if (typeOf(keyword) == K_INITIAL)
-        p = d.f().createInitial(d.location(keyword));
+    if (keyword.type == K_INITIAL)
+        p = d.f().createInitial((keyword).location);
     else
-        p = d.f().createAlways(d.location(keyword));
+        p = d.f().createAlways((keyword).location);
     p->Attributes = a;
     p->Statement = s;
     d.scope().concurrent->Process.push_back(p);
 }
 
-void Tn_VerilogParser::taskBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a,
+void Tn_VerilogParser::taskBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a,
                                  bool automatic) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
-    Tn_VerilogTask* t = named(d.f().createTask(d.location(keyword)), name, d.scope().region);
+    const Tn_Symbol name = id.text;
+    Tn_VerilogTask* t = named(d.f().createTask((keyword).location), name, d.scope().region);
     t->AutomaticFlag = automatic;
     t->Attributes = a;
-    if (declareName(d, t, name, d.location(id))) d.scope().concurrent->Task.push_back(t);
+    if (declareName(d, t, name, (id).location)) d.scope().concurrent->Task.push_back(t);
     pushScope(d, Impl::TASK, t, nullptr, true);
 }
 
-void Tn_VerilogParser::taskEnd(const TokenRef&) { d_->scopes.pop_back(); }
+void Tn_VerilogParser::taskEnd(const Tn_VerilogTok&) { d_->scopes.pop_back(); }
 
-void Tn_VerilogParser::functionBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a,
+void Tn_VerilogParser::functionBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a,
                                      bool automatic, Tn_VerilogDeclSpec& result) {
     Impl& d = *d_;
-    const Tn_Symbol name = d.symbol(id);
-    Tn_VerilogFunction* fn = named(d.f().createFunction(d.location(keyword)), name, d.scope().region);
+    const Tn_Symbol name = id.text;
+    Tn_VerilogFunction* fn = named(d.f().createFunction((keyword).location), name, d.scope().region);
     fn->AutomaticFlag = automatic;
     fn->Attributes = a;
     if (result.kind != Tn_VerilogDeclSpec::NONE || result.range || result.isSigned) {
         if (result.kind == Tn_VerilogDeclSpec::NONE) result.kind = Tn_VerilogDeclSpec::REG;
         fn->ReturnType = typeDefOf(d, result);
     }
-    if (declareName(d, fn, name, d.location(id))) d.scope().concurrent->Function.push_back(fn);
+    if (declareName(d, fn, name, (id).location)) d.scope().concurrent->Function.push_back(fn);
     pushScope(d, Impl::FUNCTION, fn, nullptr, true);
     // The function's name is its result variable inside it.
     d.scope().names->map[name].declaration = fn;
     ++d.functionDepth;
 }
 
-void Tn_VerilogParser::functionEnd(const TokenRef& end) {
+void Tn_VerilogParser::functionEnd(const Tn_VerilogTok& end) {
     Impl& d = *d_;
     Tn_VerilogFunction* fn = static_cast<Tn_VerilogFunction*>(d.scope().region);
     bool input = false;
     for (Tn_VerilogIODeclaration* io : fn->IODeclaration) input = input || io->isA(V::Input);
     if (!input)
-        error(d.location(end), "%sFunction '%s' must contain at least one input declaration\n", fn->Name.c_str());
+        error((end).location, "%sFunction '%s' must contain at least one input declaration\n", fn->Name.c_str());
     d.scopes.pop_back();
     --d.functionDepth;
 }
@@ -1693,9 +1643,9 @@ void Tn_VerilogParser::procedureBody(Tn_VerilogStatement* s) {
 
 // --------------------------------------------------------------- generate
 
-void Tn_VerilogParser::generateRegionBegin(const TokenRef& keyword) {
+void Tn_VerilogParser::generateRegionBegin(const Tn_VerilogTok& keyword) {
     Impl& d = *d_;
-    Tn_VerilogGenerate* g = named(d.f().createGenerate(d.location(keyword)), Tn_Symbol(), d.scope().region);
+    Tn_VerilogGenerate* g = named(d.f().createGenerate((keyword).location), Tn_Symbol(), d.scope().region);
     d.scope().concurrent->Generate.push_back(g);
     // A generate region is no scope of its own: its names are the module's.
     pushScope(d, Impl::GENERATE, g, g, false);
@@ -1707,11 +1657,11 @@ void Tn_VerilogParser::addGenerateStatement(Tn_VerilogGenerateStatement* g) {
     if (g) d_->scope().concurrent->GenerateStatement.push_back(g);
 }
 
-Tn_VerilogGenerateStatement* Tn_VerilogParser::generateBlockBegin(const TokenRef& first, const TokenRef& name) {
+Tn_VerilogGenerateStatement* Tn_VerilogParser::generateBlockBegin(const Tn_VerilogTok& first, const Tn_VerilogTok& name) {
     Impl& d = *d_;
-    const Tn_Location loc = d.location(first);
+    const Tn_Location loc = (first).location;
     Tn_VerilogGenerateBlock* b = d.f().createGenerateBlock(loc);
-    Tn_VerilogGenerate* g = named(d.f().createGenerate(loc), name ? d.symbol(name) : Tn_Symbol(), d.scope().region);
+    Tn_VerilogGenerate* g = named(d.f().createGenerate(loc), name ? name.text : Tn_Symbol(), d.scope().region);
     b->Generate = g;
     pushScope(d, Impl::GENERATE, g, g, true);
     return b;
@@ -1719,15 +1669,15 @@ Tn_VerilogGenerateStatement* Tn_VerilogParser::generateBlockBegin(const TokenRef
 
 void Tn_VerilogParser::generateBlockEnd(Tn_VerilogGenerateStatement*) { d_->scopes.pop_back(); }
 
-Tn_VerilogGenerateStatement* Tn_VerilogParser::generateForBegin(const TokenRef& keyword, const TokenRef& genvar,
-                                                                const TokenRef& id, Tn_VerilogExpression* init,
-                                                                Tn_VerilogExpression* condition, const TokenRef& id2,
+Tn_VerilogGenerateStatement* Tn_VerilogParser::generateForBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& genvar,
+                                                                const Tn_VerilogTok& id, Tn_VerilogExpression* init,
+                                                                Tn_VerilogExpression* condition, const Tn_VerilogTok& id2,
                                                                 Tn_VerilogExpression* step) {
     Impl& d = *d_;
     if (genvar) declareGenvar(id, nullptr);
-    if (d.symbol(id2) != d.symbol(id))
-        error(d.location(id2), "%sGenerate for increment must update '%s'\n", d.symbol(id).c_str());
-    Tn_VerilogGenerateFor* g = d.f().createGenerateFor(d.location(keyword));
+    if (id2.text != id.text)
+        error((id2).location, "%sGenerate for increment must update '%s'\n", id.text.c_str());
+    Tn_VerilogGenerateFor* g = d.f().createGenerateFor((keyword).location);
     g->Index = simpleName(id);
     g->Initializer = blockingAssign(id, nullptr, simpleName(id), nullptr, init);
     g->Condition = condition;
@@ -1735,19 +1685,19 @@ Tn_VerilogGenerateStatement* Tn_VerilogParser::generateForBegin(const TokenRef& 
     return g;
 }
 
-void Tn_VerilogParser::generateLoopBodyBegin(Tn_VerilogGenerateStatement* g, const TokenRef& first,
-                                             const TokenRef& name) {
+void Tn_VerilogParser::generateLoopBodyBegin(Tn_VerilogGenerateStatement* g, const Tn_VerilogTok& first,
+                                             const Tn_VerilogTok& name) {
     Impl& d = *d_;
-    const Tn_Location loc = d.location(first);
-    const int type = typeOf(first);
+    const Tn_Location loc = (first).location;
+    const int type = first.type;
     if (type == K_IF || type == K_CASE)
         error(loc, "%sConditionally generated items must appear with a named begin-end block\n");
     else if (type != K_BEGIN || !name)
         error(loc, "%sGenerated begin-end blocks must be named\n");
-    const Tn_Symbol label = name ? d.symbol(name) : Tn_Symbol();
+    const Tn_Symbol label = name ? name.text : Tn_Symbol();
     // The loop's block is the template of the elements of its array.
     Tn_VerilogGenerateArray* a = named(d.f().createGenerateArray(loc), label, d.scope().region);
-    if (name) declareName(d, a, label, d.location(name));
+    if (name) declareName(d, a, label, (name).location);
     static_cast<Tn_VerilogGenerateFor*>(g)->GenerateArray = a;
     Tn_VerilogGenerate* body = named(d.f().createGenerate(loc), label, a);
     a->Generate.insert(0, body);
@@ -1756,8 +1706,8 @@ void Tn_VerilogParser::generateLoopBodyBegin(Tn_VerilogGenerateStatement* g, con
 
 void Tn_VerilogParser::generateLoopBodyEnd(Tn_VerilogGenerateStatement*) { d_->scopes.pop_back(); }
 
-Tn_VerilogGenerateStatement* Tn_VerilogParser::makeGenerateIf(const TokenRef& keyword, Tn_VerilogExpression* c) {
-    Tn_VerilogGenerateIf* g = d_->f().createGenerateIf(d_->location(keyword));
+Tn_VerilogGenerateStatement* Tn_VerilogParser::makeGenerateIf(const Tn_VerilogTok& keyword, Tn_VerilogExpression* c) {
+    Tn_VerilogGenerateIf* g = d_->f().createGenerateIf((keyword).location);
     g->Condition = c;
     return g;
 }
@@ -1771,15 +1721,15 @@ void Tn_VerilogParser::generateIfBranch(Tn_VerilogGenerateStatement* g, Tn_Veril
         i->FalseStatement = branch;
 }
 
-Tn_VerilogGenerateStatement* Tn_VerilogParser::makeGenerateCase(const TokenRef& keyword, Tn_VerilogExpression* e) {
-    Tn_VerilogGenerateCase* g = d_->f().createGenerateCase(d_->location(keyword));
+Tn_VerilogGenerateStatement* Tn_VerilogParser::makeGenerateCase(const Tn_VerilogTok& keyword, Tn_VerilogExpression* e) {
+    Tn_VerilogGenerateCase* g = d_->f().createGenerateCase((keyword).location);
     g->Selector = e;
     return g;
 }
 
 Tn_VerilogGenerateStatement* Tn_VerilogParser::generateCaseItemBegin(Tn_VerilogGenerateStatement* g,
-                                                                     const TokenRef& first) {
-    Tn_VerilogGenerateCaseItem* i = d_->f().createGenerateCaseItem(d_->location(first));
+                                                                     const Tn_VerilogTok& first) {
+    Tn_VerilogGenerateCaseItem* i = d_->f().createGenerateCaseItem((first).location);
     static_cast<Tn_VerilogGenerateCase*>(g)->CaseItem.push_back(i);
     return i;
 }
@@ -1815,10 +1765,10 @@ V::EdgeType edgeType(int token) {
 
 }  // namespace
 
-Tn_VerilogNode* Tn_VerilogParser::pulseControlBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) {
+Tn_VerilogNode* Tn_VerilogParser::pulseControlBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
-    Tn_VerilogPulseControl* p = d.f().createPulseControl(d.location(keyword));
-    switch (typeOf(keyword)) {
+    Tn_VerilogPulseControl* p = d.f().createPulseControl((keyword).location);
+    switch (keyword.type) {
     case K_PULSESTYLE_ONEVENT: p->PulseControlType = V::PulseStyleOnEvent; break;
     case K_PULSESTYLE_ONDETECT: p->PulseControlType = V::PulseStyleOnDetect; break;
     case K_SHOWCANCELLED: p->PulseControlType = V::ShowCancelled; break;
@@ -1833,10 +1783,10 @@ void Tn_VerilogParser::pulseControlOutput(Tn_VerilogNode* p, Tn_VerilogExpressio
     static_cast<Tn_VerilogPulseControl*>(p)->Output.push_back(pathTerm(*d_, e, V::OutputPort, V::NoEdge));
 }
 
-Tn_VerilogNode* Tn_VerilogParser::pathBegin(const TokenRef& first, Tn_VerilogAttributes* a,
+Tn_VerilogNode* Tn_VerilogParser::pathBegin(const Tn_VerilogTok& first, Tn_VerilogAttributes* a,
                                             Tn_VerilogExpression* condition, bool ifnone) {
     Impl& d = *d_;
-    Tn_VerilogPath* p = d.f().createPath(d.location(first));
+    Tn_VerilogPath* p = d.f().createPath((first).location);
     p->Attributes = a;
     p->Condition = condition;
     p->IfNoneFlag = ifnone;
@@ -1881,7 +1831,7 @@ void Tn_VerilogParser::pathDelay(Tn_VerilogNode* p, Tn_VerilogExpression* e) {
     static_cast<Tn_VerilogListOp*>(path->Delay.get())->Operand.push_back(e);
 }
 
-void Tn_VerilogParser::pathEnd(Tn_VerilogNode* p, const TokenRef&) {
+void Tn_VerilogParser::pathEnd(Tn_VerilogNode* p, const Tn_VerilogTok&) {
     Tn_VerilogPath* path = static_cast<Tn_VerilogPath*>(p);
     const size_t n = static_cast<Tn_VerilogListOp*>(path->Delay.get())->Operand.size();
     if (n != 1 && n != 2 && n != 3 && n != 6 && n != 12)
@@ -1889,10 +1839,10 @@ void Tn_VerilogParser::pathEnd(Tn_VerilogNode* p, const TokenRef&) {
                             path->location().text().c_str(), static_cast<int>(n));
 }
 
-Tn_VerilogNode* Tn_VerilogParser::timingCheckBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) {
+Tn_VerilogNode* Tn_VerilogParser::timingCheckBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
-    Tn_VerilogTchk* c = d.f().createTchk(d.location(keyword));
-    c->TchkType = timingCheckType(typeOf(keyword));
+    Tn_VerilogTchk* c = d.f().createTchk((keyword).location);
+    c->TchkType = timingCheckType(keyword.type);
     c->Attributes = a;
     d.module->Tchk.push_back(c);
     d.timingArguments.clear();
@@ -1900,12 +1850,12 @@ Tn_VerilogNode* Tn_VerilogParser::timingCheckBegin(const TokenRef& keyword, Tn_V
     return c;
 }
 
-void Tn_VerilogParser::timingCheckArg(Tn_VerilogNode*, const TokenRef& where, int edge, unsigned descriptors,
+void Tn_VerilogParser::timingCheckArg(Tn_VerilogNode*, const Tn_VerilogTok& where, int edge, unsigned descriptors,
                                       Tn_VerilogExpression* e, Tn_VerilogExpression* condition) {
     d_->timingArguments.push_back(Impl::TimingArgument{where, edge, descriptors, e, condition});
 }
 
-void Tn_VerilogParser::timingCheckEnd(Tn_VerilogNode* node, const TokenRef& paren) {
+void Tn_VerilogParser::timingCheckEnd(Tn_VerilogNode* node, const Tn_VerilogTok& paren) {
     Impl& d = *d_;
     Tn_VerilogTchk* c = static_cast<Tn_VerilogTchk*>(node);
     const TimingCheckShape shape = timingCheckShape(c->TchkType);
@@ -1944,12 +1894,12 @@ void Tn_VerilogParser::timingCheckEnd(Tn_VerilogNode* node, const TokenRef& pare
             c->Notifier = args[i].e;
             continue;
         }
-        c->Expression.push_back(args[i].e ? args[i].e : d.f().createNullOp(d.location(args[i].where)));
+        c->Expression.push_back(args[i].e ? args[i].e : d.f().createNullOp((args[i].where).location));
     }
 }
 
-void Tn_VerilogParser::ignoreSpecifyTask(const TokenRef& id) {
-    warning(d_->location(id), "%sIgnoring invalid system-task inside specify block\n");
+void Tn_VerilogParser::ignoreSpecifyTask(const Tn_VerilogTok& id) {
+    warning((id).location, "%sIgnoring invalid system-task inside specify block\n");
     if (LA(1) != LPAREN) return;
     for (int depth = 0;;) {
         const int type = LA(1);
@@ -1977,26 +1927,26 @@ T* attributed(T* n, Tn_VerilogAttributes* a) {
 
 }  // namespace
 
-Tn_VerilogStatement* Tn_VerilogParser::nullStatement(const TokenRef& semi, Tn_VerilogAttributes* a) {
-    return attributed(d_->f().createNullStatement(d_->location(semi)), a);
+Tn_VerilogStatement* Tn_VerilogParser::nullStatement(const Tn_VerilogTok& semi, Tn_VerilogAttributes* a) {
+    return attributed(d_->f().createNullStatement((semi).location), a);
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::blockingAssign(const TokenRef& first, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::blockingAssign(const Tn_VerilogTok& first, Tn_VerilogAttributes* a,
                                                       Tn_VerilogExpression* target, Tn_VerilogStatement* control,
                                                       Tn_VerilogExpression* source) {
     Impl& d = *d_;
-    Tn_VerilogBlockingAssign* s = attributed(d.f().createBlockingAssign(d.location(first)), a);
+    Tn_VerilogBlockingAssign* s = attributed(d.f().createBlockingAssign((first).location), a);
     s->Target = target;
     s->Source = source;
     s->TimingControl = static_cast<Tn_VerilogTimingControl*>(control);
     return deep(d, s, {target, source, control});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::nonBlockingAssign(const TokenRef& first, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::nonBlockingAssign(const Tn_VerilogTok& first, Tn_VerilogAttributes* a,
                                                          Tn_VerilogExpression* target, Tn_VerilogStatement* control,
                                                          Tn_VerilogExpression* source) {
     Impl& d = *d_;
-    Tn_VerilogNonBlockingAssign* s = attributed(d.f().createNonBlockingAssign(d.location(first)), a);
+    Tn_VerilogNonBlockingAssign* s = attributed(d.f().createNonBlockingAssign((first).location), a);
     s->Target = target;
     s->Source = source;
     s->TimingControl = static_cast<Tn_VerilogTimingControl*>(control);
@@ -2004,12 +1954,12 @@ Tn_VerilogStatement* Tn_VerilogParser::nonBlockingAssign(const TokenRef& first, 
     return deep(d, s, {target, source, control});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::taskCall(const TokenRef& first, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::taskCall(const Tn_VerilogTok& first, Tn_VerilogAttributes* a,
                                                 Tn_VerilogExpression* name) {
     Impl& d = *d_;
     Tn_VerilogName* n = Tn_VerilogNode::cast<Tn_VerilogName>(name);
-    if (!n) throw syntaxError(LT(1), "unexpected token: " + LT(1)->getText());
-    Tn_VerilogUserTaskCall* s = attributed(d.f().createUserTaskCall(d.location(first)), a);
+    if (!n) throw syntaxError(tok(), "unexpected token: " + textOf(tok()));
+    Tn_VerilogUserTaskCall* s = attributed(d.f().createUserTaskCall((first).location), a);
     s->Name = n;
     notInFunction(d, s->location(), "%sIllegal task call within function\n");
     return s;
@@ -2023,62 +1973,62 @@ void Tn_VerilogParser::callArgument(Tn_VerilogNode* call, Tn_VerilogExpression* 
     deepen(*d_, call, e);
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::systemCall(const TokenRef& id) {
-    Tn_VerilogSystemFunctionCall* c = d_->f().createSystemFunctionCall(d_->location(id));
-    c->Name = d_->symbol(id);
+Tn_VerilogExpression* Tn_VerilogParser::systemCall(const Tn_VerilogTok& id) {
+    Tn_VerilogSystemFunctionCall* c = d_->f().createSystemFunctionCall((id).location);
+    c->Name = id.text;
     return c;
 }
 
-void Tn_VerilogParser::systemArgument(Tn_VerilogExpression* call, Tn_VerilogExpression* e, const TokenRef& where) {
+void Tn_VerilogParser::systemArgument(Tn_VerilogExpression* call, Tn_VerilogExpression* e, const Tn_VerilogTok& where) {
     Impl& d = *d_;
-    if (!e) e = d.f().createNullOp(d.location(where));
+    if (!e) e = d.f().createNullOp((where).location);
     static_cast<Tn_VerilogFunctionCall*>(call)->Param.push_back(e);
     deepen(d, call, e);
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::systemTask(const TokenRef& id, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::systemTask(const Tn_VerilogTok& id, Tn_VerilogAttributes* a,
                                                   Tn_VerilogExpression* call) {
     Impl& d = *d_;
-    Tn_VerilogSystemTaskCall* s = attributed(d.f().createSystemTaskCall(d.location(id)), a);
-    s->Name = d.symbol(id);
+    Tn_VerilogSystemTaskCall* s = attributed(d.f().createSystemTaskCall((id).location), a);
+    s->Name = id.text;
     s->Param.raw().swap(static_cast<Tn_VerilogFunctionCall*>(call)->Param.raw());
     return deep(d, s, {call});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::delayControl(const TokenRef& hash, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::delayControl(const Tn_VerilogTok& hash, Tn_VerilogAttributes* a,
                                                     Tn_VerilogExpression* dl, Tn_VerilogStatement* s) {
     Impl& d = *d_;
-    Tn_VerilogDelayControl* c = attributed(d.f().createDelayControl(d.location(hash)), a);
+    Tn_VerilogDelayControl* c = attributed(d.f().createDelayControl((hash).location), a);
     c->Delay = dl;
     c->Statement = s;
     notInFunction(d, c->location(), "%sIllegal delay control statement within function\n");
     return deep(d, c, {dl, s});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::repeatControl(const TokenRef& keyword, Tn_VerilogExpression* count,
+Tn_VerilogStatement* Tn_VerilogParser::repeatControl(const Tn_VerilogTok& keyword, Tn_VerilogExpression* count,
                                                      Tn_VerilogStatement* eventControl) {
     Impl& d = *d_;
-    Tn_VerilogRepeatControl* c = d.f().createRepeatControl(d.location(keyword));
+    Tn_VerilogRepeatControl* c = d.f().createRepeatControl((keyword).location);
     c->Count = count;
     c->Event = static_cast<Tn_VerilogEventControl*>(eventControl)->Event;
     return deep(d, c, {count, eventControl});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::makeEventControl(const TokenRef& at, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::makeEventControl(const Tn_VerilogTok& at, Tn_VerilogAttributes* a,
                                                         Tn_VerilogEventExpression* e) {
     Impl& d = *d_;
     // An event control written with a star has no event expression.
-    Tn_VerilogEventControl* c = attributed(d.f().createEventControl(d.location(at)), a);
+    Tn_VerilogEventControl* c = attributed(d.f().createEventControl((at).location), a);
     c->Event = e;
     notInFunction(d, c->location(), "%sIllegal event control statement within function\n");
     return deep(d, c, {e});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::emptyEventControl(const TokenRef& at, Tn_VerilogAttributes* a,
-                                                         const TokenRef& paren) {
+Tn_VerilogStatement* Tn_VerilogParser::emptyEventControl(const Tn_VerilogTok& at, Tn_VerilogAttributes* a,
+                                                         const Tn_VerilogTok& paren) {
     Impl& d = *d_;
-    error(d.location(at), "%sEmpty sensitivity list\n");
-    return makeEventControl(at, a, d.f().createNullOp(d.location(paren)));
+    error((at).location, "%sEmpty sensitivity list\n");
+    return makeEventControl(at, a, d.f().createNullOp((paren).location));
 }
 
 void Tn_VerilogParser::eventControlBody(Tn_VerilogStatement* control, Tn_VerilogStatement* s) {
@@ -2097,16 +2047,16 @@ void Tn_VerilogParser::eventOrAdd(Tn_VerilogEventExpression* o, Tn_VerilogEventE
     deepen(*d_, o, e);
 }
 
-Tn_VerilogEventExpression* Tn_VerilogParser::edgeEvent(const TokenRef& keyword, Tn_VerilogExpression* e) {
-    Tn_VerilogUnaryEventOp* u = d_->f().createUnaryEventOp(d_->location(keyword));
-    u->OpType = typeOf(keyword) == K_POSEDGE ? V::PosedgeOp : V::NegedgeOp;
+Tn_VerilogEventExpression* Tn_VerilogParser::edgeEvent(const Tn_VerilogTok& keyword, Tn_VerilogExpression* e) {
+    Tn_VerilogUnaryEventOp* u = d_->f().createUnaryEventOp((keyword).location);
+    u->OpType = keyword.type == K_POSEDGE ? V::PosedgeOp : V::NegedgeOp;
     u->Operand = e;
     return deep(*d_, u, {e});
 }
 
 size_t Tn_VerilogParser::ifChainBegin() { return d_->ifs.size(); }
 
-void Tn_VerilogParser::ifChainAdd(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
+void Tn_VerilogParser::ifChainAdd(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
                                   Tn_VerilogStatement* s) {
     d_->ifs.push_back(Impl::IfItem{keyword, a, c, s});
 }
@@ -2118,7 +2068,7 @@ Tn_VerilogStatement* Tn_VerilogParser::ifChainEnd(size_t mark, Tn_VerilogStateme
     Tn_VerilogStatement* s = otherwise;
     for (size_t i = d.ifs.size(); i-- > mark;) {
         const Impl::IfItem& item = d.ifs[i];
-        Tn_VerilogIf* n = attributed(d.f().createIf(d.location(item.token)), item.attributes);
+        Tn_VerilogIf* n = attributed(d.f().createIf((item.token).location), item.attributes);
         n->Condition = item.condition;
         n->TrueStatement = item.statement;
         n->FalseStatement = s;
@@ -2128,9 +2078,9 @@ Tn_VerilogStatement* Tn_VerilogParser::ifChainEnd(size_t mark, Tn_VerilogStateme
     return s;
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::caseBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) {
-    Tn_VerilogCase* c = attributed(d_->f().createCase(d_->location(keyword)), a);
-    const int type = typeOf(keyword);
+Tn_VerilogStatement* Tn_VerilogParser::caseBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) {
+    Tn_VerilogCase* c = attributed(d_->f().createCase((keyword).location), a);
+    const int type = keyword.type;
     c->CaseType = type == K_CASEZ ? V::CaseZ : type == K_CASEX ? V::CaseX : V::PlainCase;
     return c;
 }
@@ -2140,8 +2090,8 @@ void Tn_VerilogParser::caseSelector(Tn_VerilogStatement* c, Tn_VerilogExpression
     deepen(*d_, c, e);
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::caseItemBegin(Tn_VerilogStatement* c, const TokenRef& first) {
-    Tn_VerilogCaseItem* i = d_->f().createCaseItem(d_->location(first));
+Tn_VerilogStatement* Tn_VerilogParser::caseItemBegin(Tn_VerilogStatement* c, const Tn_VerilogTok& first) {
+    Tn_VerilogCaseItem* i = d_->f().createCaseItem((first).location);
     static_cast<Tn_VerilogCase*>(c)->CaseItem.push_back(i);
     d_->caseStack.push_back(c);
     return i;
@@ -2160,33 +2110,33 @@ void Tn_VerilogParser::caseItemBody(Tn_VerilogStatement* item, Tn_VerilogStateme
     d.caseStack.pop_back();
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::forever(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::forever(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                Tn_VerilogStatement* s) {
-    Tn_VerilogForever* l = attributed(d_->f().createForever(d_->location(keyword)), a);
+    Tn_VerilogForever* l = attributed(d_->f().createForever((keyword).location), a);
     l->Statement = s;
     return deep(*d_, l, {s});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::repeat(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::repeat(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                               Tn_VerilogExpression* e, Tn_VerilogStatement* s) {
-    Tn_VerilogRepeat* l = attributed(d_->f().createRepeat(d_->location(keyword)), a);
+    Tn_VerilogRepeat* l = attributed(d_->f().createRepeat((keyword).location), a);
     l->Condition = e;
     l->Statement = s;
     return deep(*d_, l, {e, s});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::whileLoop(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::whileLoop(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                  Tn_VerilogExpression* e, Tn_VerilogStatement* s) {
-    Tn_VerilogWhile* l = attributed(d_->f().createWhile(d_->location(keyword)), a);
+    Tn_VerilogWhile* l = attributed(d_->f().createWhile((keyword).location), a);
     l->Condition = e;
     l->Statement = s;
     return deep(*d_, l, {e, s});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::forLoop(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::forLoop(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                Tn_VerilogStatement* init, Tn_VerilogExpression* c,
                                                Tn_VerilogStatement* step, Tn_VerilogStatement* s) {
-    Tn_VerilogFor* l = attributed(d_->f().createFor(d_->location(keyword)), a);
+    Tn_VerilogFor* l = attributed(d_->f().createFor((keyword).location), a);
     l->Initializer = init;
     l->Condition = c;
     l->Incrementor = step;
@@ -2194,21 +2144,21 @@ Tn_VerilogStatement* Tn_VerilogParser::forLoop(const TokenRef& keyword, Tn_Veril
     return deep(*d_, l, {init, c, step, s});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::blockBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) {
-    Tn_VerilogBlockStatement* b = attributed(d_->f().createBlockStatement(d_->location(keyword)), a);
-    b->BlockType = typeOf(keyword) == K_FORK ? V::ParallelBlock : V::SequentialBlock;
+Tn_VerilogStatement* Tn_VerilogParser::blockBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) {
+    Tn_VerilogBlockStatement* b = attributed(d_->f().createBlockStatement((keyword).location), a);
+    b->BlockType = keyword.type == K_FORK ? V::ParallelBlock : V::SequentialBlock;
     return b;
 }
 
 // A named block is a scope of its own, declared where it stands; the
 // statement refers to it.
-Tn_VerilogStatement* Tn_VerilogParser::blockName(Tn_VerilogStatement* b, const TokenRef& id) {
+Tn_VerilogStatement* Tn_VerilogParser::blockName(Tn_VerilogStatement* b, const Tn_VerilogTok& id) {
     Impl& d = *d_;
     Tn_VerilogBlockStatement* plain = static_cast<Tn_VerilogBlockStatement*>(b);
-    const Tn_Symbol name = d.symbol(id);
+    const Tn_Symbol name = id.text;
     Tn_VerilogBlock* block = named(d.f().createBlock(b->location()), name, d.scope().region);
     block->BlockType = plain->BlockType;
-    if (declareName(d, block, name, d.location(id))) d.scope().region->Block.push_back(block);
+    if (declareName(d, block, name, (id).location)) d.scope().region->Block.push_back(block);
     Tn_VerilogNamedBlockStatement* s = attributed(d.f().createNamedBlockStatement(b->location()), b->Attributes.get());
     s->Name = name;
     s->Block = block;
@@ -2228,56 +2178,56 @@ void Tn_VerilogParser::blockEnd(Tn_VerilogStatement* b) {
     if (b->isA(V::NamedBlockStatement)) d_->scopes.pop_back();
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::makeWait(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::makeWait(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                 Tn_VerilogExpression* e, Tn_VerilogStatement* s) {
     Impl& d = *d_;
-    Tn_VerilogWait* w = attributed(d.f().createWait(d.location(keyword)), a);
+    Tn_VerilogWait* w = attributed(d.f().createWait((keyword).location), a);
     w->Condition = e;
     w->Statement = s;
     notInFunction(d, w->location(), "%sIllegal wait statement within function\n");
     return deep(d, w, {e, s});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::disable(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::disable(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                Tn_VerilogExpression* n) {
     Tn_VerilogName* name = Tn_VerilogNode::cast<Tn_VerilogName>(n);
     if (!name) throw syntaxError(keyword, "the operand of disable must be a task or block name");
-    Tn_VerilogDisable* s = attributed(d_->f().createDisable(d_->location(keyword)), a);
+    Tn_VerilogDisable* s = attributed(d_->f().createDisable((keyword).location), a);
     s->Name = name;
     return s;
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::makeEventTrigger(const TokenRef& arrow, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::makeEventTrigger(const Tn_VerilogTok& arrow, Tn_VerilogAttributes* a,
                                                         Tn_VerilogExpression* n) {
     Impl& d = *d_;
-    Tn_VerilogEventTrigger* s = attributed(d.f().createEventTrigger(d.location(arrow)), a);
+    Tn_VerilogEventTrigger* s = attributed(d.f().createEventTrigger((arrow).location), a);
     s->Operand = n;
     notInFunction(d, s->location(), "%sIllegal event trigger within function\n");
     return deep(d, s, {n});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::proceduralAssign(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::proceduralAssign(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                         Tn_VerilogExpression* target, Tn_VerilogExpression* source) {
     Impl& d = *d_;
     Tn_VerilogSourcedAssign* s;
-    if (typeOf(keyword) == K_FORCE)
-        s = d.f().createForce(d.location(keyword));
+    if (keyword.type == K_FORCE)
+        s = d.f().createForce((keyword).location);
     else
-        s = d.f().createAssign(d.location(keyword));
+        s = d.f().createAssign((keyword).location);
     s->Attributes = a;
     s->Target = target;
     s->Source = source;
     return deep(d, s, {target, source});
 }
 
-Tn_VerilogStatement* Tn_VerilogParser::proceduralRelease(const TokenRef& keyword, Tn_VerilogAttributes* a,
+Tn_VerilogStatement* Tn_VerilogParser::proceduralRelease(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                                          Tn_VerilogExpression* target) {
     Impl& d = *d_;
     Tn_VerilogAssignment* s;
-    if (typeOf(keyword) == K_RELEASE)
-        s = d.f().createRelease(d.location(keyword));
+    if (keyword.type == K_RELEASE)
+        s = d.f().createRelease((keyword).location);
     else
-        s = d.f().createDeassign(d.location(keyword));
+        s = d.f().createDeassign((keyword).location);
     s->Attributes = a;
     s->Target = target;
     return deep(d, s, {target});
@@ -2287,7 +2237,7 @@ Tn_VerilogStatement* Tn_VerilogParser::proceduralRelease(const TokenRef& keyword
 
 size_t Tn_VerilogParser::conditionalBegin() { return d_->conditionals.size(); }
 
-void Tn_VerilogParser::conditionalAdd(const TokenRef& question, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
+void Tn_VerilogParser::conditionalAdd(const Tn_VerilogTok& question, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
                                       Tn_VerilogExpression* t) {
     d_->conditionals.push_back(Impl::ConditionalItem{question, a, c, t});
 }
@@ -2335,10 +2285,10 @@ size_t Tn_VerilogParser::binaryBegin() {
 
 void Tn_VerilogParser::binaryOperand(Tn_VerilogExpression* e) { d_->operands.push_back(e); }
 
-void Tn_VerilogParser::binaryOperator(const TokenRef& op, Tn_VerilogAttributes* a) {
+void Tn_VerilogParser::binaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
     BinaryOperator b{V::LogicalOr, 0};
-    ::binaryOperator(typeOf(op), b);
+    ::binaryOperator(op.type, b);
     const size_t base = d.binaryFrames.back();
     while (d.operators.size() > base && d.operators.back().op.precedence >= b.precedence) reduce(d);
     d.operators.push_back(Impl::Operator{op, a, b});
@@ -2358,7 +2308,7 @@ Tn_VerilogExpression* Tn_VerilogParser::binaryEnd(size_t, Tn_VerilogExpression* 
 
 size_t Tn_VerilogParser::unaryBegin() { return d_->unaries.size(); }
 
-void Tn_VerilogParser::unaryOperator(const TokenRef& op, Tn_VerilogAttributes* a) {
+void Tn_VerilogParser::unaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) {
     d_->unaries.push_back(Impl::UnaryItem{op, a});
 }
 
@@ -2367,8 +2317,8 @@ Tn_VerilogExpression* Tn_VerilogParser::unaryEnd(size_t mark, Tn_VerilogExpressi
     Tn_VerilogExpression* e = operand;
     for (size_t i = d.unaries.size(); i-- > mark;) {
         const Impl::UnaryItem& item = d.unaries[i];
-        Tn_VerilogUnaryOp* op = attributed(d.f().createUnaryOp(d.location(item.token)), item.attributes);
-        op->OpType = ::unaryOperator(typeOf(item.token));
+        Tn_VerilogUnaryOp* op = attributed(d.f().createUnaryOp((item.token).location), item.attributes);
+        op->OpType = ::unaryOperator(item.token.type);
         op->Operand = e;
         e = deep(d, op, {e});
     }
@@ -2376,7 +2326,7 @@ Tn_VerilogExpression* Tn_VerilogParser::unaryEnd(size_t mark, Tn_VerilogExpressi
     return e;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::minTypMax(const TokenRef&, Tn_VerilogExpression* min,
+Tn_VerilogExpression* Tn_VerilogParser::minTypMax(const Tn_VerilogTok&, Tn_VerilogExpression* min,
                                                   Tn_VerilogExpression* typ, Tn_VerilogExpression* max) {
     Tn_VerilogMinTypMaxOp* op = d_->f().createMinTypMaxOp(min->location());
     op->MinOperand = min;
@@ -2385,14 +2335,14 @@ Tn_VerilogExpression* Tn_VerilogParser::minTypMax(const TokenRef&, Tn_VerilogExp
     return deep(*d_, op, {min, typ, max});
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::makeConcatenation(const TokenRef& brace, Tn_VerilogExpression* first) {
-    Tn_VerilogConcatOp* c = d_->f().createConcatOp(d_->location(brace));
+Tn_VerilogExpression* Tn_VerilogParser::makeConcatenation(const Tn_VerilogTok& brace, Tn_VerilogExpression* first) {
+    Tn_VerilogConcatOp* c = d_->f().createConcatOp((brace).location);
     c->Operand.push_back(first);
     return deep(*d_, c, {first});
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::multipleConcatenation(const TokenRef& brace, Tn_VerilogExpression* count) {
-    Tn_VerilogMultipleConcatOp* c = d_->f().createMultipleConcatOp(d_->location(brace));
+Tn_VerilogExpression* Tn_VerilogParser::multipleConcatenation(const Tn_VerilogTok& brace, Tn_VerilogExpression* count) {
+    Tn_VerilogMultipleConcatOp* c = d_->f().createMultipleConcatOp((brace).location);
     c->Count = count;
     return deep(*d_, c, {count});
 }
@@ -2405,7 +2355,7 @@ void Tn_VerilogParser::concatenationAdd(Tn_VerilogExpression* c, Tn_VerilogExpre
     deepen(*d_, c, e);
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::functionCall(const TokenRef& paren, Tn_VerilogAttributes* a,
+Tn_VerilogExpression* Tn_VerilogParser::functionCall(const Tn_VerilogTok& paren, Tn_VerilogAttributes* a,
                                                      Tn_VerilogExpression* name) {
     Impl& d = *d_;
     Tn_VerilogName* n = Tn_VerilogNode::cast<Tn_VerilogName>(name);
@@ -2430,11 +2380,11 @@ Tn_VerilogExpression* Tn_VerilogParser::functionCall(const TokenRef& paren, Tn_V
 
 size_t Tn_VerilogParser::nameBegin() { return d_->nameParts.size(); }
 
-void Tn_VerilogParser::nameComponent(const TokenRef& id) {
+void Tn_VerilogParser::nameComponent(const Tn_VerilogTok& id) {
     d_->nameParts.push_back(Impl::NamePart{id, d_->selects.size()});
 }
 
-void Tn_VerilogParser::nameSelect(const TokenRef& bracket, int kind, Tn_VerilogExpression* e1,
+void Tn_VerilogParser::nameSelect(const Tn_VerilogTok& bracket, int kind, Tn_VerilogExpression* e1,
                                   Tn_VerilogExpression* e2) {
     d_->selects.push_back(Impl::Select{bracket, kind, e1, e2});
 }
@@ -2460,20 +2410,20 @@ Tn_VerilogExpression* Tn_VerilogParser::nameEnd(size_t mark) {
     const size_t parts = d.nameParts.size() - mark;
     auto selectsEnd = [&](size_t i) { return i + 1 < parts ? d.nameParts[mark + i + 1].selects : d.selects.size(); };
     const Impl::NamePart& first = d.nameParts[mark];
-    const Tn_Location loc = d.location(first.id);
+    const Tn_Location loc = (first.id).location;
     Tn_VerilogExpression* e;
     if (parts == 1) {
         e = simpleName(first.id);
     } else {
         Tn_VerilogScopeName* s = d.f().createScopeName(loc);
-        s->Name = d.symbol(first.id);
+        s->Name = first.id.text;
         Tn_VerilogHierarchicalName* prefix = s;
         for (size_t i = 0; i + 1 < parts; ++i) {
             const Impl::NamePart& p = d.nameParts[mark + i];
             if (i > 0) {
                 Tn_VerilogSelectedName* n = d.f().createSelectedName(loc);
                 n->Prefix = prefix;
-                n->Suffix = d.symbol(p.id);
+                n->Suffix = p.id.text;
                 prefix = deep(d, n, {prefix});
             }
             const size_t count = selectsEnd(i) - p.selects;
@@ -2487,7 +2437,7 @@ Tn_VerilogExpression* Tn_VerilogParser::nameEnd(size_t mark) {
         }
         Tn_VerilogSelectedName* n = d.f().createSelectedName(loc);
         n->Prefix = prefix;
-        n->Suffix = d.symbol(d.nameParts.back().id);
+        n->Suffix = d.nameParts.back().id.text;
         e = deep(d, n, {prefix});
     }
     const size_t begin = d.nameParts.back().selects, end = d.selects.size();
@@ -2534,13 +2484,13 @@ Tn_VerilogExpression* Tn_VerilogParser::nameEnd(size_t mark) {
     return e;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::simpleName(const TokenRef& id) {
-    Tn_VerilogSimpleName* n = d_->f().createSimpleName(d_->location(id));
-    n->Name = d_->symbol(id);
+Tn_VerilogExpression* Tn_VerilogParser::simpleName(const Tn_VerilogTok& id) {
+    Tn_VerilogSimpleName* n = d_->f().createSimpleName((id).location);
+    n->Name = id.text;
     return n;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::bitSelect(const TokenRef&, Tn_VerilogExpression* operand,
+Tn_VerilogExpression* Tn_VerilogParser::bitSelect(const Tn_VerilogTok&, Tn_VerilogExpression* operand,
                                                   Tn_VerilogExpression* index) {
     Tn_VerilogBitSelect* b = d_->f().createBitSelect(operand->location());
     b->Operand = static_cast<Tn_VerilogOperand*>(operand);
@@ -2548,7 +2498,7 @@ Tn_VerilogExpression* Tn_VerilogParser::bitSelect(const TokenRef&, Tn_VerilogExp
     return deep(*d_, b, {operand, index});
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::partSelect(const TokenRef&, Tn_VerilogExpression* operand,
+Tn_VerilogExpression* Tn_VerilogParser::partSelect(const Tn_VerilogTok&, Tn_VerilogExpression* operand,
                                                    Tn_VerilogExpression* msb, Tn_VerilogExpression* lsb) {
     Tn_VerilogPartSelect* p = d_->f().createPartSelect(operand->location());
     p->Operand = static_cast<Tn_VerilogOperand*>(operand);
@@ -2559,17 +2509,17 @@ Tn_VerilogExpression* Tn_VerilogParser::partSelect(const TokenRef&, Tn_VerilogEx
 
 // ---------------------------------------------------------------- numbers
 
-Tn_VerilogExpression* Tn_VerilogParser::stringConstant(const TokenRef& s) {
+Tn_VerilogExpression* Tn_VerilogParser::stringConstant(const Tn_VerilogTok& s) {
     const std::string& text = textOf(s);
-    Tn_VerilogVectorConst* c = d_->f().createVectorConst(d_->location(s));
+    Tn_VerilogVectorConst* c = d_->f().createVectorConst((s).location);
     c->Value = Tn_VerilogVector(V::String, false, 0, text.data(), text.size());
     return c;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::integerConstant(const TokenRef& digits) {
+Tn_VerilogExpression* Tn_VerilogParser::integerConstant(const Tn_VerilogTok& digits) {
     Impl& d = *d_;
     const std::string& text = textOf(digits);
-    const Tn_Location loc = d.location(digits);
+    const Tn_Location loc = (digits).location;
     uint64_t value = 0;
     bool wide = false;
     for (char c : text) {
@@ -2591,17 +2541,17 @@ Tn_VerilogExpression* Tn_VerilogParser::integerConstant(const TokenRef& digits) 
     return c;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::realConstant(const TokenRef& r) {
-    Tn_VerilogRealConst* c = d_->f().createRealConst(d_->location(r));
+Tn_VerilogExpression* Tn_VerilogParser::realConstant(const Tn_VerilogTok& r) {
+    Tn_VerilogRealConst* c = d_->f().createRealConst((r).location);
     c->Value = std::strtod(textOf(r).c_str(), nullptr);
     return c;
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::basedConstant(const TokenRef& size, const TokenRef& base,
-                                                      const TokenRef& digits) {
+Tn_VerilogExpression* Tn_VerilogParser::basedConstant(const Tn_VerilogTok& size, const Tn_VerilogTok& base,
+                                                      const Tn_VerilogTok& digits) {
     Impl& d = *d_;
-    const Tn_Location loc = d.location(size ? size : base);
-    const int type = typeOf(base);
+    const Tn_Location loc = (size ? size : base).location;
+    const int type = base.type;
     const bool isSigned = type == BASE_SD || type == BASE_SB || type == BASE_SO || type == BASE_SH;
     V::BaseType radix;
     const char* word;

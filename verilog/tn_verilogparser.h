@@ -83,80 +83,80 @@ protected:
     // Construction hooks (tn_veriloggrammarutil.h).
     void nestingExceeded() override;
     bool declarationAhead(bool ports) override;
-    void skipConfiguration(const TokenRef& config) override;
-    void beginModule(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a) override;
-    void endModule(const TokenRef& end) override;
-    void modulePort(const TokenRef& where, const TokenRef& name, Tn_VerilogExpression* e) override;
-    Tn_VerilogExpression* portReferenceName(const TokenRef& id) override;
-    void udpBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a) override;
-    void udpPort(const TokenRef& id) override;
-    void udpInitialStatement(const TokenRef& keyword, const TokenRef& id, Tn_VerilogExpression* e) override;
-    void udpTableBegin(const TokenRef& table) override;
+    void skipConfiguration(const Tn_VerilogTok& config) override;
+    void beginModule(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a) override;
+    void endModule(const Tn_VerilogTok& end) override;
+    void modulePort(const Tn_VerilogTok& where, const Tn_VerilogTok& name, Tn_VerilogExpression* e) override;
+    Tn_VerilogExpression* portReferenceName(const Tn_VerilogTok& id) override;
+    void udpBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a) override;
+    void udpPort(const Tn_VerilogTok& id) override;
+    void udpInitialStatement(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogExpression* e) override;
+    void udpTableBegin(const Tn_VerilogTok& table) override;
     bool udpSequential() override;
-    void udpRowBegin(const TokenRef& first) override;
-    void udpRowSymbol(const TokenRef& symbol) override;
-    void udpRowEdgeOpen(const TokenRef& paren) override;
-    void udpRowEdgeClose(const TokenRef& paren) override;
-    void udpRowColon(const TokenRef& colon) override;
-    void udpRowEnd(const TokenRef& semi) override;
-    void udpEnd(const TokenRef& end) override;
-    Tn_VerilogAttributes* attributesBegin(const TokenRef& open) override;
-    void attributeAdd(Tn_VerilogAttributes* a, const TokenRef& id, Tn_VerilogExpression* e) override;
-    void declarePort(Tn_VerilogDeclSpec& s, const TokenRef& id, Tn_VerilogExpression* init) override;
+    void udpRowBegin(const Tn_VerilogTok& first) override;
+    void udpRowSymbol(const Tn_VerilogTok& symbol) override;
+    void udpRowEdgeOpen(const Tn_VerilogTok& paren) override;
+    void udpRowEdgeClose(const Tn_VerilogTok& paren) override;
+    void udpRowColon(const Tn_VerilogTok& colon) override;
+    void udpRowEnd(const Tn_VerilogTok& semi) override;
+    void udpEnd(const Tn_VerilogTok& end) override;
+    Tn_VerilogAttributes* attributesBegin(const Tn_VerilogTok& open) override;
+    void attributeAdd(Tn_VerilogAttributes* a, const Tn_VerilogTok& id, Tn_VerilogExpression* e) override;
+    void declarePort(Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, Tn_VerilogExpression* init) override;
     size_t dimensionsBegin() override;
     void dimensionAdd(Tn_VerilogRange* r) override;
-    void declareNet(Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims, Tn_VerilogExpression* e) override;
-    void declareVariable(Tn_VerilogDeclSpec& s, const TokenRef& id, size_t dims, Tn_VerilogExpression* e) override;
-    void declareGenvar(const TokenRef& id, Tn_VerilogAttributes* a) override;
-    void declareParameter(Tn_VerilogParamSpec& s, const TokenRef& id, Tn_VerilogExpression* e) override;
-    Tn_VerilogExpression* pulseLimits(const TokenRef& paren, Tn_VerilogExpression* reject,
+    void declareNet(Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, size_t dims, Tn_VerilogExpression* e) override;
+    void declareVariable(Tn_VerilogDeclSpec& s, const Tn_VerilogTok& id, size_t dims, Tn_VerilogExpression* e) override;
+    void declareGenvar(const Tn_VerilogTok& id, Tn_VerilogAttributes* a) override;
+    void declareParameter(Tn_VerilogParamSpec& s, const Tn_VerilogTok& id, Tn_VerilogExpression* e) override;
+    Tn_VerilogExpression* pulseLimits(const Tn_VerilogTok& paren, Tn_VerilogExpression* reject,
                                       Tn_VerilogExpression* error) override;
-    void defparam(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
+    void defparam(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
                   Tn_VerilogExpression* value) override;
-    Tn_VerilogDriveStrength* driveStrengthBegin(const TokenRef& paren) override;
+    Tn_VerilogDriveStrength* driveStrengthBegin(const Tn_VerilogTok& paren) override;
     void driveStrengthAdd(Tn_VerilogDriveStrength* s, int keyword) override;
-    Tn_VerilogRange* makeRange(const TokenRef& bracket, Tn_VerilogExpression* msb, Tn_VerilogExpression* lsb) override;
-    Tn_VerilogDelay* delayBegin(const TokenRef& hash) override;
+    Tn_VerilogRange* makeRange(const Tn_VerilogTok& bracket, Tn_VerilogExpression* msb, Tn_VerilogExpression* lsb) override;
+    Tn_VerilogDelay* delayBegin(const Tn_VerilogTok& hash) override;
     void delayAdd(Tn_VerilogDelay* d, Tn_VerilogExpression* e) override;
-    void contAssign(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s, Tn_VerilogDelay* d,
+    void contAssign(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogDriveStrength* s, Tn_VerilogDelay* d,
                     Tn_VerilogExpression* target, Tn_VerilogExpression* source) override;
-    Tn_VerilogNode* gateBegin(Tn_VerilogInstSpec& s, const TokenRef& id, Tn_VerilogRange* r,
-                              const TokenRef& paren) override;
+    Tn_VerilogNode* gateBegin(Tn_VerilogInstSpec& s, const Tn_VerilogTok& id, Tn_VerilogRange* r,
+                              const Tn_VerilogTok& paren) override;
     void gateTerminal(Tn_VerilogNode* gate, Tn_VerilogExpression* e) override;
     void gateEnd(Tn_VerilogInstSpec& s, Tn_VerilogNode* gate) override;
     size_t parameterValuesBegin() override;
-    void paramValue(Tn_VerilogInstSpec& s, const TokenRef& name, Tn_VerilogExpression* e) override;
-    Tn_VerilogNode* instanceBegin(Tn_VerilogInstSpec& s, const TokenRef& id, Tn_VerilogRange* r,
-                                  const TokenRef& paren) override;
-    void connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a, const TokenRef& where, const TokenRef& name,
+    void paramValue(Tn_VerilogInstSpec& s, const Tn_VerilogTok& name, Tn_VerilogExpression* e) override;
+    Tn_VerilogNode* instanceBegin(Tn_VerilogInstSpec& s, const Tn_VerilogTok& id, Tn_VerilogRange* r,
+                                  const Tn_VerilogTok& paren) override;
+    void connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a, const Tn_VerilogTok& where, const Tn_VerilogTok& name,
                     Tn_VerilogExpression* e) override;
     void instantiationEnd(Tn_VerilogInstSpec& s) override;
-    void process(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) override;
-    void taskBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a, bool automatic) override;
-    void taskEnd(const TokenRef& end) override;
-    void functionBegin(const TokenRef& keyword, const TokenRef& id, Tn_VerilogAttributes* a, bool automatic,
+    void process(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) override;
+    void taskBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a, bool automatic) override;
+    void taskEnd(const Tn_VerilogTok& end) override;
+    void functionBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& id, Tn_VerilogAttributes* a, bool automatic,
                        Tn_VerilogDeclSpec& result) override;
-    void functionEnd(const TokenRef& end) override;
+    void functionEnd(const Tn_VerilogTok& end) override;
     void procedureBody(Tn_VerilogStatement* s) override;
-    void generateRegionBegin(const TokenRef& keyword) override;
+    void generateRegionBegin(const Tn_VerilogTok& keyword) override;
     void generateRegionEnd() override;
     void addGenerateStatement(Tn_VerilogGenerateStatement* g) override;
-    Tn_VerilogGenerateStatement* generateBlockBegin(const TokenRef& first, const TokenRef& name) override;
+    Tn_VerilogGenerateStatement* generateBlockBegin(const Tn_VerilogTok& first, const Tn_VerilogTok& name) override;
     void generateBlockEnd(Tn_VerilogGenerateStatement* g) override;
-    Tn_VerilogGenerateStatement* generateForBegin(const TokenRef& keyword, const TokenRef& genvar, const TokenRef& id,
+    Tn_VerilogGenerateStatement* generateForBegin(const Tn_VerilogTok& keyword, const Tn_VerilogTok& genvar, const Tn_VerilogTok& id,
                                                   Tn_VerilogExpression* init, Tn_VerilogExpression* condition,
-                                                  const TokenRef& id2, Tn_VerilogExpression* step) override;
-    void generateLoopBodyBegin(Tn_VerilogGenerateStatement* g, const TokenRef& first, const TokenRef& name) override;
+                                                  const Tn_VerilogTok& id2, Tn_VerilogExpression* step) override;
+    void generateLoopBodyBegin(Tn_VerilogGenerateStatement* g, const Tn_VerilogTok& first, const Tn_VerilogTok& name) override;
     void generateLoopBodyEnd(Tn_VerilogGenerateStatement* g) override;
-    Tn_VerilogGenerateStatement* makeGenerateIf(const TokenRef& keyword, Tn_VerilogExpression* c) override;
+    Tn_VerilogGenerateStatement* makeGenerateIf(const Tn_VerilogTok& keyword, Tn_VerilogExpression* c) override;
     void generateIfBranch(Tn_VerilogGenerateStatement* g, Tn_VerilogGenerateStatement* branch, bool then) override;
-    Tn_VerilogGenerateStatement* makeGenerateCase(const TokenRef& keyword, Tn_VerilogExpression* e) override;
-    Tn_VerilogGenerateStatement* generateCaseItemBegin(Tn_VerilogGenerateStatement* g, const TokenRef& first) override;
+    Tn_VerilogGenerateStatement* makeGenerateCase(const Tn_VerilogTok& keyword, Tn_VerilogExpression* e) override;
+    Tn_VerilogGenerateStatement* generateCaseItemBegin(Tn_VerilogGenerateStatement* g, const Tn_VerilogTok& first) override;
     void generateCaseItemExpression(Tn_VerilogGenerateStatement* item, Tn_VerilogExpression* e) override;
     void generateCaseItemBody(Tn_VerilogGenerateStatement* item, Tn_VerilogGenerateStatement* body) override;
-    Tn_VerilogNode* pulseControlBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) override;
+    Tn_VerilogNode* pulseControlBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) override;
     void pulseControlOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
-    Tn_VerilogNode* pathBegin(const TokenRef& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* condition,
+    Tn_VerilogNode* pathBegin(const Tn_VerilogTok& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* condition,
                               bool ifnone) override;
     void pathEdge(Tn_VerilogNode* p, int edge) override;
     void pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
@@ -165,93 +165,93 @@ protected:
     void pathOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
     void pathData(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
     void pathDelay(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
-    void pathEnd(Tn_VerilogNode* p, const TokenRef& semi) override;
-    Tn_VerilogNode* timingCheckBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) override;
-    void timingCheckArg(Tn_VerilogNode* c, const TokenRef& where, int edge, unsigned descriptors,
+    void pathEnd(Tn_VerilogNode* p, const Tn_VerilogTok& semi) override;
+    Tn_VerilogNode* timingCheckBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) override;
+    void timingCheckArg(Tn_VerilogNode* c, const Tn_VerilogTok& where, int edge, unsigned descriptors,
                         Tn_VerilogExpression* e, Tn_VerilogExpression* condition) override;
-    void timingCheckEnd(Tn_VerilogNode* c, const TokenRef& paren) override;
-    void ignoreSpecifyTask(const TokenRef& id) override;
-    Tn_VerilogStatement* nullStatement(const TokenRef& semi, Tn_VerilogAttributes* a) override;
-    Tn_VerilogStatement* blockingAssign(const TokenRef& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
+    void timingCheckEnd(Tn_VerilogNode* c, const Tn_VerilogTok& paren) override;
+    void ignoreSpecifyTask(const Tn_VerilogTok& id) override;
+    Tn_VerilogStatement* nullStatement(const Tn_VerilogTok& semi, Tn_VerilogAttributes* a) override;
+    Tn_VerilogStatement* blockingAssign(const Tn_VerilogTok& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
                                         Tn_VerilogStatement* control, Tn_VerilogExpression* source) override;
-    Tn_VerilogStatement* nonBlockingAssign(const TokenRef& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
+    Tn_VerilogStatement* nonBlockingAssign(const Tn_VerilogTok& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* target,
                                            Tn_VerilogStatement* control, Tn_VerilogExpression* source) override;
-    Tn_VerilogStatement* taskCall(const TokenRef& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* name) override;
+    Tn_VerilogStatement* taskCall(const Tn_VerilogTok& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* name) override;
     void callArgument(Tn_VerilogNode* call, Tn_VerilogExpression* e) override;
-    Tn_VerilogExpression* systemCall(const TokenRef& id) override;
-    void systemArgument(Tn_VerilogExpression* call, Tn_VerilogExpression* e, const TokenRef& where) override;
-    Tn_VerilogStatement* systemTask(const TokenRef& id, Tn_VerilogAttributes* a, Tn_VerilogExpression* call) override;
-    Tn_VerilogStatement* delayControl(const TokenRef& hash, Tn_VerilogAttributes* a, Tn_VerilogExpression* d,
+    Tn_VerilogExpression* systemCall(const Tn_VerilogTok& id) override;
+    void systemArgument(Tn_VerilogExpression* call, Tn_VerilogExpression* e, const Tn_VerilogTok& where) override;
+    Tn_VerilogStatement* systemTask(const Tn_VerilogTok& id, Tn_VerilogAttributes* a, Tn_VerilogExpression* call) override;
+    Tn_VerilogStatement* delayControl(const Tn_VerilogTok& hash, Tn_VerilogAttributes* a, Tn_VerilogExpression* d,
                                       Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* repeatControl(const TokenRef& keyword, Tn_VerilogExpression* count,
+    Tn_VerilogStatement* repeatControl(const Tn_VerilogTok& keyword, Tn_VerilogExpression* count,
                                        Tn_VerilogStatement* eventControl) override;
-    Tn_VerilogStatement* makeEventControl(const TokenRef& at, Tn_VerilogAttributes* a,
+    Tn_VerilogStatement* makeEventControl(const Tn_VerilogTok& at, Tn_VerilogAttributes* a,
                                           Tn_VerilogEventExpression* e) override;
-    Tn_VerilogStatement* emptyEventControl(const TokenRef& at, Tn_VerilogAttributes* a, const TokenRef& paren) override;
+    Tn_VerilogStatement* emptyEventControl(const Tn_VerilogTok& at, Tn_VerilogAttributes* a, const Tn_VerilogTok& paren) override;
     void eventControlBody(Tn_VerilogStatement* control, Tn_VerilogStatement* s) override;
     Tn_VerilogEventExpression* eventOr(Tn_VerilogEventExpression* first) override;
     void eventOrAdd(Tn_VerilogEventExpression* o, Tn_VerilogEventExpression* e) override;
-    Tn_VerilogEventExpression* edgeEvent(const TokenRef& keyword, Tn_VerilogExpression* e) override;
+    Tn_VerilogEventExpression* edgeEvent(const Tn_VerilogTok& keyword, Tn_VerilogExpression* e) override;
     size_t ifChainBegin() override;
-    void ifChainAdd(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
+    void ifChainAdd(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
                     Tn_VerilogStatement* s) override;
     Tn_VerilogStatement* ifChainEnd(size_t mark, Tn_VerilogStatement* otherwise) override;
-    Tn_VerilogStatement* caseBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) override;
+    Tn_VerilogStatement* caseBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) override;
     void caseSelector(Tn_VerilogStatement* c, Tn_VerilogExpression* e) override;
-    Tn_VerilogStatement* caseItemBegin(Tn_VerilogStatement* c, const TokenRef& first) override;
+    Tn_VerilogStatement* caseItemBegin(Tn_VerilogStatement* c, const Tn_VerilogTok& first) override;
     void caseItemExpression(Tn_VerilogStatement* item, Tn_VerilogExpression* e) override;
     void caseItemBody(Tn_VerilogStatement* item, Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* forever(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* repeat(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
+    Tn_VerilogStatement* forever(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) override;
+    Tn_VerilogStatement* repeat(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
                                 Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* whileLoop(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
+    Tn_VerilogStatement* whileLoop(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
                                    Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* forLoop(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* init,
+    Tn_VerilogStatement* forLoop(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* init,
                                  Tn_VerilogExpression* c, Tn_VerilogStatement* step, Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* blockBegin(const TokenRef& keyword, Tn_VerilogAttributes* a) override;
-    Tn_VerilogStatement* blockName(Tn_VerilogStatement* b, const TokenRef& id) override;
+    Tn_VerilogStatement* blockBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) override;
+    Tn_VerilogStatement* blockName(Tn_VerilogStatement* b, const Tn_VerilogTok& id) override;
     void blockAdd(Tn_VerilogStatement* b, Tn_VerilogStatement* s) override;
     void blockEnd(Tn_VerilogStatement* b) override;
-    Tn_VerilogStatement* makeWait(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
+    Tn_VerilogStatement* makeWait(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
                                   Tn_VerilogStatement* s) override;
-    Tn_VerilogStatement* disable(const TokenRef& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* n) override;
-    Tn_VerilogStatement* makeEventTrigger(const TokenRef& arrow, Tn_VerilogAttributes* a,
+    Tn_VerilogStatement* disable(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* n) override;
+    Tn_VerilogStatement* makeEventTrigger(const Tn_VerilogTok& arrow, Tn_VerilogAttributes* a,
                                           Tn_VerilogExpression* n) override;
-    Tn_VerilogStatement* proceduralAssign(const TokenRef& keyword, Tn_VerilogAttributes* a,
+    Tn_VerilogStatement* proceduralAssign(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                           Tn_VerilogExpression* target, Tn_VerilogExpression* source) override;
-    Tn_VerilogStatement* proceduralRelease(const TokenRef& keyword, Tn_VerilogAttributes* a,
+    Tn_VerilogStatement* proceduralRelease(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,
                                            Tn_VerilogExpression* target) override;
     size_t conditionalBegin() override;
-    void conditionalAdd(const TokenRef& question, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
+    void conditionalAdd(const Tn_VerilogTok& question, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
                         Tn_VerilogExpression* t) override;
     Tn_VerilogExpression* conditionalEnd(size_t mark, Tn_VerilogExpression* last) override;
     size_t binaryBegin() override;
     void binaryOperand(Tn_VerilogExpression* e) override;
-    void binaryOperator(const TokenRef& op, Tn_VerilogAttributes* a) override;
+    void binaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) override;
     Tn_VerilogExpression* binaryEnd(size_t mark, Tn_VerilogExpression* last) override;
     size_t unaryBegin() override;
-    void unaryOperator(const TokenRef& op, Tn_VerilogAttributes* a) override;
+    void unaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) override;
     Tn_VerilogExpression* unaryEnd(size_t mark, Tn_VerilogExpression* operand) override;
-    Tn_VerilogExpression* minTypMax(const TokenRef& colon, Tn_VerilogExpression* min, Tn_VerilogExpression* typ,
+    Tn_VerilogExpression* minTypMax(const Tn_VerilogTok& colon, Tn_VerilogExpression* min, Tn_VerilogExpression* typ,
                                     Tn_VerilogExpression* max) override;
-    Tn_VerilogExpression* makeConcatenation(const TokenRef& brace, Tn_VerilogExpression* first) override;
-    Tn_VerilogExpression* multipleConcatenation(const TokenRef& brace, Tn_VerilogExpression* count) override;
+    Tn_VerilogExpression* makeConcatenation(const Tn_VerilogTok& brace, Tn_VerilogExpression* first) override;
+    Tn_VerilogExpression* multipleConcatenation(const Tn_VerilogTok& brace, Tn_VerilogExpression* count) override;
     void concatenationAdd(Tn_VerilogExpression* c, Tn_VerilogExpression* e) override;
-    Tn_VerilogExpression* functionCall(const TokenRef& paren, Tn_VerilogAttributes* a,
+    Tn_VerilogExpression* functionCall(const Tn_VerilogTok& paren, Tn_VerilogAttributes* a,
                                        Tn_VerilogExpression* name) override;
     size_t nameBegin() override;
-    void nameComponent(const TokenRef& id) override;
-    void nameSelect(const TokenRef& bracket, int kind, Tn_VerilogExpression* e1, Tn_VerilogExpression* e2) override;
+    void nameComponent(const Tn_VerilogTok& id) override;
+    void nameSelect(const Tn_VerilogTok& bracket, int kind, Tn_VerilogExpression* e1, Tn_VerilogExpression* e2) override;
     Tn_VerilogExpression* nameEnd(size_t mark) override;
-    Tn_VerilogExpression* simpleName(const TokenRef& id) override;
-    Tn_VerilogExpression* bitSelect(const TokenRef& bracket, Tn_VerilogExpression* operand,
+    Tn_VerilogExpression* simpleName(const Tn_VerilogTok& id) override;
+    Tn_VerilogExpression* bitSelect(const Tn_VerilogTok& bracket, Tn_VerilogExpression* operand,
                                     Tn_VerilogExpression* index) override;
-    Tn_VerilogExpression* partSelect(const TokenRef& bracket, Tn_VerilogExpression* operand, Tn_VerilogExpression* msb,
+    Tn_VerilogExpression* partSelect(const Tn_VerilogTok& bracket, Tn_VerilogExpression* operand, Tn_VerilogExpression* msb,
                                      Tn_VerilogExpression* lsb) override;
-    Tn_VerilogExpression* stringConstant(const TokenRef& s) override;
-    Tn_VerilogExpression* integerConstant(const TokenRef& digits) override;
-    Tn_VerilogExpression* realConstant(const TokenRef& r) override;
-    Tn_VerilogExpression* basedConstant(const TokenRef& size, const TokenRef& base, const TokenRef& digits) override;
+    Tn_VerilogExpression* stringConstant(const Tn_VerilogTok& s) override;
+    Tn_VerilogExpression* integerConstant(const Tn_VerilogTok& digits) override;
+    Tn_VerilogExpression* realConstant(const Tn_VerilogTok& r) override;
+    Tn_VerilogExpression* basedConstant(const Tn_VerilogTok& size, const Tn_VerilogTok& base, const Tn_VerilogTok& digits) override;
 
 public:
     // The parser's state (tn_verilogparser.cpp).
