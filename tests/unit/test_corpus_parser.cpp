@@ -1,0 +1,133 @@
+// The parser over the parser corpus (clean compilations without a message,
+// their top-level units, every faulty variant with exactly its messages) and
+// over the shared corpus of real designs.
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <fstream>
+#include <sstream>
+#include <unistd.h>
+
+#include "tests/support/parse.h"
+#include "tests/support/parsercorpus.h"
+
+namespace {
+
+struct Outcome {
+    std::vector<std::string> levels, messages;
+    std::vector<std::string> tops;
+};
+
+Outcome parseCase(const CorpusCase& c, const std::vector<std::string>& files) {
+    std::vector<std::string> args = files;
+    for (const std::string& d : c.includeDirs) args.push_back("+incdir+" + d);
+    for (const std::string& d : c.defines) args.push_back("+define+" + d);
+    if (c.mode == "1995") args.push_back("-1995");
+    CaptureSink sink;
+    ParseResult r = parseArgs(args);
+    Outcome o;
+    for (const CaptureSink::Message& m : sink.messages) {
+        if (m.level == PORT_MSG_STATUS) continue;
+        o.levels.push_back(m.level == PORT_MSG_ERROR ? "error" : m.level == PORT_MSG_WARNING ? "warning" : "other");
+        o.messages.push_back(m.text.substr(0, m.text.size() - 1));
+    }
+    o.tops = r.tops();
+    return o;
+}
+
+// Runs from inside the laid-out corpus, as its file names are relative to it.
+class ParserOverCorpus : public ::testing::Test {
+protected:
+    void SetUp() override {
+        materializeParserCorpus(dir);
+        char buf[4096];
+        ASSERT_TRUE(getcwd(buf, sizeof buf));
+        previous = buf;
+        ASSERT_EQ(chdir(dir.path().c_str()), 0);
+    }
+    void TearDown() override { EXPECT_EQ(chdir(previous.c_str()), 0); }
+
+    TempDir dir;
+    std::string previous;
+};
+
+TEST_F(ParserOverCorpus, CleanCompilationsParseWithoutMessagesToTheirTops) {
+    std::string last;
+    int compilations = 0;
+    for (const CorpusCase& c : readParserCorpus()) {
+        const std::string compilation = c.name.substr(0, c.name.find('/'));
+        if (compilation == last) continue;
+        last = compilation;
+        ++compilations;
+        const Outcome o = parseCase(c, c.files);
+        EXPECT_EQ(o.messages, std::vector<std::string>{}) << compilation;
+        EXPECT_EQ(o.tops, c.tops) << compilation;
+    }
+    EXPECT_GE(compilations, 30);
+}
+
+TEST_F(ParserOverCorpus, EachFaultGivesExactlyItsMessages) {
+    int faults = 0;
+    for (const CorpusCase& c : readParserCorpus()) {
+        ++faults;
+        const Outcome o = parseCase(c, c.faultFiles);
+        EXPECT_EQ(o.levels, c.faultLevels) << c.name;
+        ASSERT_EQ(o.messages.size(), c.faultMessages.size()) << c.name << ": " << ::testing::PrintToString(o.messages);
+        for (size_t i = 0; i < o.messages.size(); ++i) {
+            const std::string& expected = c.faultMessages[i];
+            if (expected.compare(0, 7, "syntax@") == 0) {
+                // A syntax error: its wording is the runtime's, its place is fixed.
+                const size_t colon = expected.rfind(':');
+                const std::string prefix =
+                    "\"" + expected.substr(7, colon - 7) + "\" line " + expected.substr(colon + 1) + " ";
+                EXPECT_EQ(o.messages[i].substr(0, prefix.size()), prefix) << c.name << ": " << o.messages[i];
+            } else {
+                EXPECT_EQ(o.messages[i], expected) << c.name;
+            }
+        }
+    }
+    EXPECT_GE(faults, 60);
+}
+
+// The shared corpus of real designs: each compiles without an error or a
+// warning, and its manifest's top modules are among the top-level units.
+TEST(SharedCorpus, RealDesignsParseToTheirTops) {
+    const std::string root = std::string(TARN_SHARED_DIR) + "/corpus/designs";
+    std::ifstream manifest(root + "/MANIFEST.tsv");
+    if (!manifest) GTEST_SKIP() << "the shared design corpus is not at " << root;
+    std::string line;
+    std::getline(manifest, line);  // column names
+    int designs = 0;
+    while (std::getline(manifest, line)) {
+        std::vector<std::string> col;
+        std::stringstream cells(line);
+        for (std::string cell; std::getline(cells, cell, '\t');) col.push_back(cell);
+        ASSERT_GE(col.size(), 8u) << line;
+        const std::string base = root + "/" + col[0] + "/";
+        std::vector<std::string> args;
+        std::stringstream files(col[5]), incdirs(col[6]), defines(col[7]), tops(col[4]);
+        for (std::string f; files >> f;) args.push_back(base + f);
+        for (std::string d; incdirs >> d;) args.push_back("+incdir+" + base + d);
+        for (std::string d; defines >> d;) args.push_back("+define+" + d);
+        CaptureSink sink;
+        ParseResult r = parseArgs(args);
+        EXPECT_FALSE(r.compiled.empty()) << col[0];
+        EXPECT_EQ(sink.errors(), std::vector<std::string>{}) << col[0];
+        EXPECT_EQ(sink.warnings(), std::vector<std::string>{}) << col[0];
+        const std::vector<std::string> found = r.tops();
+        for (std::string top; tops >> top;) {
+            if (std::find(found.begin(), found.end(), top) != found.end()) continue;
+            // A manifest top that a chosen top instantiates (tate_pairing:
+            // pairing instantiates tiny) is elaborated below that top.
+            bool below = false;
+            for (const std::string& t : found)
+                if (Tn_VerilogModule* m = r.module(t))
+                    for (Tn_VerilogModuleInstance* i : m->ModuleInstance) below = below || i->DefName.str().str() == top;
+            EXPECT_TRUE(below) << col[0] << ": " << top << " among " << ::testing::PrintToString(found);
+        }
+        ++designs;
+    }
+    EXPECT_GE(designs, 13);
+}
+
+}  // namespace
