@@ -582,3 +582,20 @@ TEST_F(ParserModules, TopLevelUnits) {
 }
 
 }  // namespace
+
+namespace {
+
+TEST(ParserDump, PrintsEachUnitItCompletes) {
+    TempDir dir;
+    const std::string file = dir.write("d.v", "module m(input a); wire w = a; endmodule\nprimitive p(o, i); output o; input i; table 0 : 1; endtable endprimitive\n");
+    const CommandResult r = runTarn("compile " + file + " +tarn+parser+dump");
+    EXPECT_EQ(r.status, 0) << r.err;
+    EXPECT_NE(r.out.find("Root:Tn_VerilogRoot = 0 {"), std::string::npos) << r.out;
+    EXPECT_NE(r.out.find("Module:Tn_VerilogModule = "), std::string::npos) << r.out;
+    EXPECT_NE(r.out.find("  Name:Port_String = \"m\""), std::string::npos) << r.out;
+    EXPECT_NE(r.out.find("UdpDefn:Tn_VerilogUdpDefn = "), std::string::npos) << r.out;
+    EXPECT_NE(r.out.find("TableRow:Port_String = \"0:1\""), std::string::npos) << r.out;
+    EXPECT_EQ(runTarn("compile " + file).out, "");
+}
+
+}  // namespace
