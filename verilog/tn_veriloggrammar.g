@@ -36,10 +36,14 @@ public:
     ANTLR_USE_NAMESPACE(antlr)RefToken LT(unsigned int i) override final { return lookaheadToken(i); }
     void consume() override final { dropToken(); }
     void match(int t) override final {
-        if (LA(1) != t)
-            throw ANTLR_USE_NAMESPACE(antlr)MismatchedTokenException(getTokenNames(), getNumTokens(), LT(1), t, false,
-                                                                       getFilename());
+        if (LA(1) != t) mismatch(t);
         dropToken();
+    }
+
+private:
+    [[noreturn]] void mismatch(int t) {
+        throw ANTLR_USE_NAMESPACE(antlr)MismatchedTokenException(getTokenNames(), getNumTokens(), LT(1), t, false,
+                                                                   getFilename());
     }
 }
 

@@ -322,17 +322,13 @@ struct Tn_VerilogParser::Impl {
         Tn_VerilogTok token;
         Tn_VerilogAttributes* attributes;
     };
-    struct ConditionalItem {
+    // One link of a chain read by a loop (an else-if chain, a chain of
+    // conditional operators): its condition and what it chooses.
+    struct ChainItem {
         Tn_VerilogTok token;
         Tn_VerilogAttributes* attributes;
         Tn_VerilogExpression* condition;
-        Tn_VerilogExpression* value;
-    };
-    struct IfItem {
-        Tn_VerilogTok token;
-        Tn_VerilogAttributes* attributes;
-        Tn_VerilogExpression* condition;
-        Tn_VerilogStatement* statement;
+        Tn_VerilogNode* value;
     };
     struct NamePart {
         Tn_VerilogTok id;
@@ -402,8 +398,7 @@ struct Tn_VerilogParser::Impl {
     std::vector<Tn_VerilogExpression*> operands;
     std::vector<Operator> operators;
     std::vector<UnaryItem> unaries;
-    std::vector<ConditionalItem> conditionals;
-    std::vector<IfItem> ifs;
+    std::vector<ChainItem> chain;
     std::vector<NamePart> nameParts;
     std::vector<Select> selects;
     std::vector<TimingArgument> timingArguments;
@@ -2054,28 +2049,35 @@ Tn_VerilogEventExpression* Tn_VerilogParser::edgeEvent(const Tn_VerilogTok& keyw
     return deep(*d_, u, {e});
 }
 
-size_t Tn_VerilogParser::ifChainBegin() { return d_->ifs.size(); }
+size_t Tn_VerilogParser::ifChainBegin() { return d_->chain.size(); }
 
 void Tn_VerilogParser::ifChainAdd(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
                                   Tn_VerilogStatement* s) {
-    d_->ifs.push_back(Impl::IfItem{keyword, a, c, s});
+    d_->chain.push_back(Impl::ChainItem{keyword, a, c, s});
 }
 
-// An else-if chain is read by a loop; its statements are built from the
-// last else upwards.
+namespace {
+
+// A chain read by a loop is built from its last alternative upwards, each
+// link by make(link, what follows it).
+template <class T, class Make>
+T* endChain(Impl& d, size_t mark, T* last, Make make) {
+    for (size_t i = d.chain.size(); i-- > mark;) last = make(d.chain[i], last);
+    d.chain.resize(mark);
+    return last;
+}
+
+}  // namespace
+
 Tn_VerilogStatement* Tn_VerilogParser::ifChainEnd(size_t mark, Tn_VerilogStatement* otherwise) {
     Impl& d = *d_;
-    Tn_VerilogStatement* s = otherwise;
-    for (size_t i = d.ifs.size(); i-- > mark;) {
-        const Impl::IfItem& item = d.ifs[i];
-        Tn_VerilogIf* n = attributed(d.f().createIf((item.token).location), item.attributes);
+    return endChain(d, mark, otherwise, [&](const Impl::ChainItem& item, Tn_VerilogStatement* rest) {
+        Tn_VerilogIf* n = attributed(d.f().createIf(item.token.location), item.attributes);
         n->Condition = item.condition;
-        n->TrueStatement = item.statement;
-        n->FalseStatement = s;
-        s = deep(d, n, {item.condition, item.statement, s});
-    }
-    d.ifs.resize(mark);
-    return s;
+        n->TrueStatement = static_cast<Tn_VerilogStatement*>(item.value);
+        n->FalseStatement = rest;
+        return deep(d, n, {item.condition, item.value, rest});
+    });
 }
 
 Tn_VerilogStatement* Tn_VerilogParser::caseBegin(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a) {
@@ -2235,28 +2237,23 @@ Tn_VerilogStatement* Tn_VerilogParser::proceduralRelease(const Tn_VerilogTok& ke
 
 // ------------------------------------------------------------ expressions
 
-size_t Tn_VerilogParser::conditionalBegin() { return d_->conditionals.size(); }
+size_t Tn_VerilogParser::conditionalBegin() { return d_->chain.size(); }
 
 void Tn_VerilogParser::conditionalAdd(const Tn_VerilogTok& question, Tn_VerilogAttributes* a, Tn_VerilogExpression* c,
                                       Tn_VerilogExpression* t) {
-    d_->conditionals.push_back(Impl::ConditionalItem{question, a, c, t});
+    d_->chain.push_back(Impl::ChainItem{question, a, c, t});
 }
 
-// A chain of conditional operators is read by a loop and built from its
-// last alternative upwards (the operator is right associative).
+// The conditional operator is right associative.
 Tn_VerilogExpression* Tn_VerilogParser::conditionalEnd(size_t mark, Tn_VerilogExpression* last) {
     Impl& d = *d_;
-    Tn_VerilogExpression* e = last;
-    for (size_t i = d.conditionals.size(); i-- > mark;) {
-        const Impl::ConditionalItem& item = d.conditionals[i];
+    return endChain(d, mark, last, [&](const Impl::ChainItem& item, Tn_VerilogExpression* rest) {
         Tn_VerilogConditionalOp* op = attributed(d.f().createConditionalOp(item.condition->location()), item.attributes);
         op->Condition = item.condition;
-        op->TrueOperand = item.value;
-        op->FalseOperand = e;
-        e = deep(d, op, {item.condition, item.value, e});
-    }
-    d.conditionals.resize(mark);
-    return e;
+        op->TrueOperand = static_cast<Tn_VerilogExpression*>(item.value);
+        op->FalseOperand = rest;
+        return deep(d, op, {item.condition, item.value, rest});
+    });
 }
 
 namespace {

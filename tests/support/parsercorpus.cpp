@@ -1,6 +1,7 @@
 #include "tests/support/parsercorpus.h"
 
 #include <dirent.h>
+#include <fstream>
 #include <sstream>
 #include <stdexcept>
 #include <unistd.h>
@@ -35,6 +36,28 @@ std::vector<std::string> listSeparated(const std::string& text, const std::strin
 }  // namespace
 
 std::string parserCorpusDir() { return std::string(TARN_TEST_DATA) + "/parser"; }
+
+std::string sharedCorpusDir() { return std::string(TARN_SHARED_DIR) + "/corpus/designs"; }
+
+bool readSharedDesigns(std::vector<SharedDesign>& designs) {
+    std::ifstream manifest(sharedCorpusDir() + "/MANIFEST.tsv");
+    if (!manifest) return false;
+    std::string line;
+    std::getline(manifest, line);  // column names
+    while (std::getline(manifest, line)) {
+        const std::vector<std::string> col = split(line, '\t');
+        if (col.size() < 8) throw std::runtime_error("malformed shared corpus manifest line: " + line);
+        SharedDesign d;
+        d.name = col[0];
+        const std::string base = sharedCorpusDir() + "/" + col[0] + "/";
+        for (const std::string& f : words(col[5])) d.args.push_back(base + f);
+        for (const std::string& i : words(col[6])) d.args.push_back("+incdir+" + base + i);
+        for (const std::string& m : words(col[7])) d.args.push_back("+define+" + m);
+        d.tops = words(col[4]);
+        designs.push_back(d);
+    }
+    return true;
+}
 
 std::vector<CorpusCase> readParserCorpus() {
     std::vector<CorpusCase> cases;

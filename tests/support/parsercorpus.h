@@ -20,6 +20,18 @@ struct CorpusCase {
     std::string notes;
 };
 
+// One design of the shared corpus of real designs: its directory name, its
+// command line (files, include directories, macros) and its top modules.
+struct SharedDesign {
+    std::string name;
+    std::vector<std::string> args;
+    std::vector<std::string> tops;
+};
+// Where the shared corpus is (TARN_SHARED_DIR/corpus/designs).
+std::string sharedCorpusDir();
+// Its designs, in manifest order; false when the corpus is not there.
+bool readSharedDesigns(std::vector<SharedDesign>& designs);
+
 // Every row of the manifest, in order.
 std::vector<CorpusCase> readParserCorpus();
 // The corpus directory in the source tree.

@@ -4,8 +4,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <fstream>
-#include <sstream>
 #include <unistd.h>
 
 #include "tests/support/parse.h"
@@ -92,30 +90,16 @@ TEST_F(ParserOverCorpus, EachFaultGivesExactlyItsMessages) {
 // The shared corpus of real designs: each compiles without an error or a
 // warning, and its manifest's top modules are among the top-level units.
 TEST(SharedCorpus, RealDesignsParseToTheirTops) {
-    const std::string root = std::string(TARN_SHARED_DIR) + "/corpus/designs";
-    std::ifstream manifest(root + "/MANIFEST.tsv");
-    if (!manifest) GTEST_SKIP() << "the shared design corpus is not at " << root;
-    std::string line;
-    std::getline(manifest, line);  // column names
-    int designs = 0;
-    while (std::getline(manifest, line)) {
-        std::vector<std::string> col;
-        std::stringstream cells(line);
-        for (std::string cell; std::getline(cells, cell, '\t');) col.push_back(cell);
-        ASSERT_GE(col.size(), 8u) << line;
-        const std::string base = root + "/" + col[0] + "/";
-        std::vector<std::string> args;
-        std::stringstream files(col[5]), incdirs(col[6]), defines(col[7]), tops(col[4]);
-        for (std::string f; files >> f;) args.push_back(base + f);
-        for (std::string d; incdirs >> d;) args.push_back("+incdir+" + base + d);
-        for (std::string d; defines >> d;) args.push_back("+define+" + d);
+    std::vector<SharedDesign> designs;
+    if (!readSharedDesigns(designs)) GTEST_SKIP() << "the shared design corpus is not at " << sharedCorpusDir();
+    for (const SharedDesign& d : designs) {
         CaptureSink sink;
-        ParseResult r = parseArgs(args);
-        EXPECT_FALSE(r.compiled.empty()) << col[0];
-        EXPECT_EQ(sink.errors(), std::vector<std::string>{}) << col[0];
-        EXPECT_EQ(sink.warnings(), std::vector<std::string>{}) << col[0];
+        ParseResult r = parseArgs(d.args);
+        EXPECT_FALSE(r.compiled.empty()) << d.name;
+        EXPECT_EQ(sink.errors(), std::vector<std::string>{}) << d.name;
+        EXPECT_EQ(sink.warnings(), std::vector<std::string>{}) << d.name;
         const std::vector<std::string> found = r.tops();
-        for (std::string top; tops >> top;) {
+        for (const std::string& top : d.tops) {
             if (std::find(found.begin(), found.end(), top) != found.end()) continue;
             // A manifest top that a chosen top instantiates (tate_pairing:
             // pairing instantiates tiny) is elaborated below that top.
@@ -123,11 +107,10 @@ TEST(SharedCorpus, RealDesignsParseToTheirTops) {
             for (const std::string& t : found)
                 if (Tn_VerilogModule* m = r.module(t))
                     for (Tn_VerilogModuleInstance* i : m->ModuleInstance) below = below || i->DefName.str().str() == top;
-            EXPECT_TRUE(below) << col[0] << ": " << top << " among " << ::testing::PrintToString(found);
+            EXPECT_TRUE(below) << d.name << ": " << top << " among " << ::testing::PrintToString(found);
         }
-        ++designs;
     }
-    EXPECT_GE(designs, 13);
+    EXPECT_GE(designs.size(), 13u);
 }
 
 }  // namespace

@@ -15,31 +15,16 @@ namespace {
 
 // The shared corpus of real designs scans without a message of any kind.
 TEST(ScannerCorpus, EveryDesignScansCleanly) {
-    const std::string root = std::string(TARN_SHARED_DIR) + "/corpus/designs";
-    std::ifstream manifest(root + "/MANIFEST.tsv");
-    if (!manifest) GTEST_SKIP() << "the shared design corpus is not at " << root;
-    std::string line;
-    std::getline(manifest, line);  // column names
-    int designs = 0;
-    while (std::getline(manifest, line)) {
-        std::vector<std::string> col;
-        std::stringstream cells(line);
-        for (std::string cell; std::getline(cells, cell, '\t');) col.push_back(cell);
-        ASSERT_GE(col.size(), 8u) << line;
-        const std::string base = root + "/" + col[0] + "/";
-        std::vector<std::string> args;
-        std::stringstream files(col[5]), incdirs(col[6]), defines(col[7]);
-        for (std::string f; files >> f;) args.push_back(base + f);
-        for (std::string d; incdirs >> d;) args.push_back("+incdir+" + base + d);
-        for (std::string d; defines >> d;) args.push_back("+define+" + d);
+    std::vector<SharedDesign> designs;
+    if (!readSharedDesigns(designs)) GTEST_SKIP() << "the shared design corpus is not at " << sharedCorpusDir();
+    for (const SharedDesign& d : designs) {
         CaptureSink sink;
-        ScanResult r = scanArgs(args);
-        EXPECT_FALSE(r.failed) << col[0] << ": " << r.errorFile << ":" << r.errorLine << " " << r.error;
-        EXPECT_EQ(sink.count(PORT_MSG_ERROR) + sink.count(PORT_MSG_WARNING), 0u) << col[0];
-        EXPECT_GT(r.tokens.size(), 1000u) << col[0];
-        ++designs;
+        ScanResult r = scanArgs(d.args);
+        EXPECT_FALSE(r.failed) << d.name << ": " << r.errorFile << ":" << r.errorLine << " " << r.error;
+        EXPECT_EQ(sink.count(PORT_MSG_ERROR) + sink.count(PORT_MSG_WARNING), 0u) << d.name;
+        EXPECT_GT(r.tokens.size(), 1000u) << d.name;
     }
-    EXPECT_GE(designs, 13);
+    EXPECT_GE(designs.size(), 13u);
 }
 
 // Texts of the messages that come from the scanner (the rest of the corpus
