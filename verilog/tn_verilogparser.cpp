@@ -280,17 +280,62 @@ struct Tn_VerilogParser::Impl {
         Tn_VerilogDeclaration* declaration = nullptr;
         Tn_VerilogIODeclaration* io = nullptr;
     };
+    // Entries by name: open addressing on the interned text's address, so a
+    // lookup touches one slot (scopes of big netlists hold millions).
+    class EntryMap {
+    public:
+        Entry* find(const Tn_Symbol& name) {
+            if (slots_.empty()) return nullptr;
+            const void* key = &name.str();
+            for (size_t i = hash(key) & mask_;; i = (i + 1) & mask_) {
+                if (slots_[i].key == key) return &slots_[i].entry;
+                if (!slots_[i].key) return nullptr;
+            }
+        }
+        Entry& operator[](const Tn_Symbol& name) {
+            if ((used_ + 1) * 2 > slots_.size()) grow();
+            const void* key = &name.str();
+            size_t i = hash(key) & mask_;
+            while (slots_[i].key && slots_[i].key != key) i = (i + 1) & mask_;
+            if (!slots_[i].key) {
+                slots_[i].key = key;
+                ++used_;
+            }
+            return slots_[i].entry;
+        }
+
+    private:
+        struct Slot {
+            const void* key = nullptr;
+            Entry entry;
+        };
+        static size_t hash(const void* key) {
+            return static_cast<size_t>((reinterpret_cast<uintptr_t>(key) >> 4) * 0x9E3779B97F4A7C15ull >> 20);
+        }
+        void grow() {
+            std::vector<Slot> old(slots_.empty() ? 16 : slots_.size() * 2);
+            old.swap(slots_);
+            mask_ = slots_.size() - 1;
+            for (const Slot& s : old) {
+                if (!s.key) continue;
+                size_t i = hash(s.key) & mask_;
+                while (slots_[i].key) i = (i + 1) & mask_;
+                slots_[i] = s;
+            }
+        }
+        std::vector<Slot> slots_;
+        size_t mask_ = 0;
+        size_t used_ = 0;
+    };
     // The names of one scope; parent is the enclosing scope (null at a
     // module or UDP). A generate region shares its module's names.
     struct Names {
-        std::unordered_map<Tn_Symbol, Entry> map;
+        EntryMap map;
         Names* parent = nullptr;
         Tn_VerilogRegion* region = nullptr;
-        const Entry* find(const Tn_Symbol& name) const {
-            for (const Names* n = this; n; n = n->parent) {
-                auto it = n->map.find(name);
-                if (it != n->map.end()) return &it->second;
-            }
+        const Entry* find(const Tn_Symbol& name) {
+            for (Names* n = this; n; n = n->parent)
+                if (const Entry* e = n->map.find(name)) return e;
             return nullptr;
         }
     };
@@ -881,10 +926,8 @@ void applyPragma(Impl& d, const std::string& text) {
     Tn_VerilogModule* m = d.module;
     const Tn_Symbol name(object.c_str());
     Tn_VerilogAttributedNode* target = nullptr;
-    auto it = d.scopes.front().names->map.find(name);
-    if (it != d.scopes.front().names->map.end())
-        target = it->second.declaration ? static_cast<Tn_VerilogAttributedNode*>(it->second.declaration)
-                                        : it->second.io;
+    if (const Impl::Entry* e = d.scopes.front().names->map.find(name))
+        target = e->declaration ? static_cast<Tn_VerilogAttributedNode*>(e->declaration) : e->io;
     else if (name == m->Name)
         target = m;
     if (!target) return;
@@ -963,9 +1006,9 @@ void portDirections(Impl& d, Tn_VerilogModule* m) {
         namesIn(p->LoConn, refs);
         int direction = -1;
         for (Tn_VerilogSimpleName* n : refs) {
-            auto it = names->map.find(n->Name);
-            if (it == names->map.end() || !it->second.io) continue;
-            const int here = directionOf(it->second.io);
+            const Impl::Entry* e = names->map.find(n->Name);
+            if (!e || !e->io) continue;
+            const int here = directionOf(e->io);
             direction = direction < 0 || direction == here ? here : V::MixedIOPort;
         }
         if (direction >= 0) p->Direction = static_cast<V::PortDirectionType>(direction);
@@ -1133,8 +1176,8 @@ void Tn_VerilogParser::udpTableBegin(const Tn_VerilogTok&) {
     Impl::Names* names = d.scope().names;
     for (size_t i = 0; i < d.udpPorts.size(); ++i) {
         const Impl::UdpPort& p = d.udpPorts[i];
-        auto it = names->map.find(p.name);
-        Tn_VerilogIODeclaration* io = it == names->map.end() ? nullptr : it->second.io;
+        const Impl::Entry* e = names->map.find(p.name);
+        Tn_VerilogIODeclaration* io = e ? e->io : nullptr;
         if (!io)
             error(p.location, "%sUDP identifier '%s' must be declared with a port mode.\n", p.name.c_str());
         else if (i == 0 && !io->isA(V::Output))
@@ -1144,9 +1187,8 @@ void Tn_VerilogParser::udpTableBegin(const Tn_VerilogTok&) {
     }
     bool sequential = false;
     if (!d.udpPorts.empty()) {
-        auto it = names->map.find(d.udpPorts.front().name);
-        if (it != names->map.end())
-            if (Tn_VerilogVariable* v = Tn_VerilogNode::cast<Tn_VerilogVariable>(it->second.declaration))
+        if (const Impl::Entry* e = names->map.find(d.udpPorts.front().name))
+            if (Tn_VerilogVariable* v = Tn_VerilogNode::cast<Tn_VerilogVariable>(e->declaration))
                 sequential = v->TypeDef && v->TypeDef->isA(V::Reg);
     }
     d.udp->PrimitiveType = sequential ? V::Seq : V::Comb;
