@@ -9,14 +9,9 @@
 
 #include <memory>
 #include <string>
-#include <unordered_map>
-#include <unordered_set>
-#include <vector>
 
-#include "library/tn_node.h"
 #include "src/tn_verilogoptions.h"
 #include "util/tn_exception.h"
-#include "util/tn_rcstring.h"
 #include "verilog/Tn_VerilogGrammar.hpp"
 #include "verilog/tn_verilogenums.h"
 
@@ -50,8 +45,9 @@ public:
     // Beyond this depth a node tree (an operator chain, an else-if chain) is
     // refused: later recursive walkers of the tree must not run out of stack.
     static const int kMaxTreeDepth = 10000;
-    // Widest based literal made (bits); wider sizes are reported.
-    static const uint32_t kMaxLiteralWidth = 1u << 24;
+    // Widest based literal made (bits): wider sizes are reported (a wider
+    // one would take megabytes, and a decimal one quadratic time, to build).
+    static const uint32_t kMaxLiteralWidth = 1u << 20;
 
     Tn_VerilogParser(const Tn_VerilogOptions& options, Tn_VerilogDirectiveState& directives,
                      Tn_VerilogTokenStreamFilter& filter);

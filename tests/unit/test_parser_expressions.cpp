@@ -213,7 +213,7 @@ TEST_F(ParserExpressions, NumberMessages) {
     EXPECT_TRUE(x->Value.isAllX());
     // Widths that fit the format but not memory are refused as well.
     value("4000000000'h1");
-    EXPECT_EQ(errors(), Texts{loc(2) + "Width on based number exceeds the supported maximum of 16777216 bits"});
+    EXPECT_EQ(errors(), Texts{loc(2) + "Width on based number exceeds the supported maximum of 1048576 bits"});
 }
 
 // The decimal digit limit is the number of digits of the largest value the
