@@ -1474,6 +1474,33 @@ void Tn_VerilogParser::contAssign(const Tn_VerilogTok&, Tn_VerilogAttributes* a,
     if (v2001()) implicitNets(d, target);
 }
 
+namespace {
+
+// A gate or an instance joins the current region alone or, with a range, as
+// the one element of an array that repeats it (so its definition is seen).
+template <class Item, class Array>
+Tn_VerilogNode* place(Impl& d, Item* item, Tn_VerilogRange* r, Tn_VerilogAttributes* attributes,
+                      Array* (Tn_VerilogNodeFactory::*createArray)(const Tn_Location&),
+                      Tn_NodeList<Item> Tn_VerilogConcurrentRegion::*items,
+                      Tn_NodeList<Array> Tn_VerilogConcurrentRegion::*arrays, Tn_NodeList<Item> Array::*elements) {
+    Tn_VerilogConcurrentRegion* region = d.scope().concurrent;
+    const Tn_Symbol name = item->Name;
+    const Tn_Location& loc = item->location();
+    if (r) {
+        Array* a = named((d.f().*createArray)(loc), name, region);
+        a->Range = r;
+        a->Attributes = attributes;
+        item->Parent = a;
+        (a->*elements).push_back(item);
+        if (declareName(d, a, name, loc)) (region->*arrays).push_back(a);
+        return a;
+    }
+    if (name.IsEmpty() || declareName(d, item, name, loc)) (region->*items).push_back(item);
+    return item;
+}
+
+}  // namespace
+
 Tn_VerilogNode* Tn_VerilogParser::gateBegin(Tn_VerilogInstSpec& s, const Tn_VerilogTok& id, Tn_VerilogRange* r,
                                             const Tn_VerilogTok& paren) {
     Impl& d = *d_;
@@ -1486,18 +1513,9 @@ Tn_VerilogNode* Tn_VerilogParser::gateBegin(Tn_VerilogInstSpec& s, const Tn_Veri
     p->Delay = s.delay;
     p->DriveStrength = s.strength;
     p->Attributes = s.attributes;
-    if (r) {
-        // The array keeps the primitive it repeats as its one element.
-        Tn_VerilogPrimitiveArray* a = named(d.f().createPrimitiveArray(loc), name, region);
-        a->Range = r;
-        a->Attributes = s.attributes;
-        p->Parent = a;
-        a->Primitive.push_back(p);
-        if (declareName(d, a, name, loc)) region->PrimitiveArray.push_back(a);
-        return a;
-    }
-    if (name.IsEmpty() || declareName(d, p, name, loc)) region->Primitive.push_back(p);
-    return p;
+    return place(d, p, r, s.attributes, &Tn_VerilogNodeFactory::createPrimitiveArray,
+                 &Tn_VerilogConcurrentRegion::Primitive, &Tn_VerilogConcurrentRegion::PrimitiveArray,
+                 &Tn_VerilogPrimitiveArray::Primitive);
 }
 
 void Tn_VerilogParser::gateTerminal(Tn_VerilogNode* gate, Tn_VerilogExpression* e) {
@@ -1590,18 +1608,9 @@ Tn_VerilogNode* Tn_VerilogParser::instanceBegin(Tn_VerilogInstSpec& s, const Tn_
             s.count == 0 ? s.strength : static_cast<Tn_VerilogDriveStrength*>(s.strength->clone(d.f()));
     if (!d.directives.uselib().empty()) uselib(d, inst);
     ++s.count;
-    if (r) {
-        // The array keeps the instance it repeats as its one element.
-        Tn_VerilogModuleArray* a = named(d.f().createModuleArray(loc), name, region);
-        a->Range = r;
-        a->Attributes = s.attributes;
-        inst->Parent = a;
-        a->ModuleInstance.push_back(inst);
-        if (declareName(d, a, name, loc)) region->ModuleArray.push_back(a);
-        return a;
-    }
-    if (name.IsEmpty() || declareName(d, inst, name, loc)) region->ModuleInstance.push_back(inst);
-    return inst;
+    return place(d, inst, r, s.attributes, &Tn_VerilogNodeFactory::createModuleArray,
+                 &Tn_VerilogConcurrentRegion::ModuleInstance, &Tn_VerilogConcurrentRegion::ModuleArray,
+                 &Tn_VerilogModuleArray::ModuleInstance);
 }
 
 void Tn_VerilogParser::connection(Tn_VerilogNode* inst, Tn_VerilogAttributes* a, const Tn_VerilogTok& where,

@@ -143,3 +143,13 @@ void materializeParserCorpus(const TempDir& dir) {
     }
     closedir(d);
 }
+
+void ParserCorpusTest::SetUp() {
+    materializeParserCorpus(dir);
+    char buf[4096];
+    ASSERT_TRUE(getcwd(buf, sizeof buf));
+    previous = buf;
+    ASSERT_EQ(chdir(dir.path().c_str()), 0);
+}
+
+void ParserCorpusTest::TearDown() { EXPECT_EQ(chdir(previous.c_str()), 0); }

@@ -7,6 +7,8 @@
 #include <string>
 #include <vector>
 
+#include <gtest/gtest.h>
+
 #include "tests/support/testfiles.h"
 
 struct CorpusCase {
@@ -42,5 +44,16 @@ std::string applyUnifiedDiff(const std::string& original, const std::string& dif
 // Lays the corpus out in dir as it stands in the source tree, with every
 // faulty variant made into its file under faulty/.
 void materializeParserCorpus(const TempDir& dir);
+
+// A fixture that runs from inside the laid-out corpus (its file names are
+// relative to it).
+class ParserCorpusTest : public ::testing::Test {
+protected:
+    void SetUp() override;
+    void TearDown() override;
+
+    TempDir dir;
+    std::string previous;
+};
 
 #endif

@@ -33,23 +33,8 @@ Outcome parseCase(const CorpusCase& c, const std::vector<std::string>& files) {
     return o;
 }
 
-// Runs from inside the laid-out corpus, as its file names are relative to it.
-class ParserOverCorpus : public ::testing::Test {
-protected:
-    void SetUp() override {
-        materializeParserCorpus(dir);
-        char buf[4096];
-        ASSERT_TRUE(getcwd(buf, sizeof buf));
-        previous = buf;
-        ASSERT_EQ(chdir(dir.path().c_str()), 0);
-    }
-    void TearDown() override { EXPECT_EQ(chdir(previous.c_str()), 0); }
 
-    TempDir dir;
-    std::string previous;
-};
-
-TEST_F(ParserOverCorpus, CleanCompilationsParseWithoutMessagesToTheirTops) {
+TEST_F(ParserCorpusTest, CleanCompilationsParseWithoutMessagesToTheirTops) {
     std::string last;
     int compilations = 0;
     for (const CorpusCase& c : readParserCorpus()) {
@@ -64,7 +49,7 @@ TEST_F(ParserOverCorpus, CleanCompilationsParseWithoutMessagesToTheirTops) {
     EXPECT_GE(compilations, 30);
 }
 
-TEST_F(ParserOverCorpus, EachFaultGivesExactlyItsMessages) {
+TEST_F(ParserCorpusTest, EachFaultGivesExactlyItsMessages) {
     int faults = 0;
     for (const CorpusCase& c : readParserCorpus()) {
         ++faults;

@@ -52,18 +52,8 @@ bool isScannerMessage(const std::string& m) {
     return false;
 }
 
-// Runs from inside the laid-out corpus, as its file names are relative to it.
-class ParserCorpusScan : public ::testing::Test {
+class ParserCorpusScan : public ParserCorpusTest {
 protected:
-    void SetUp() override {
-        materializeParserCorpus(dir);
-        char buf[4096];
-        ASSERT_TRUE(getcwd(buf, sizeof buf));
-        previous = buf;
-        ASSERT_EQ(chdir(dir.path().c_str()), 0);
-    }
-    void TearDown() override { EXPECT_EQ(chdir(previous.c_str()), 0); }
-
     // The scanner's errors and warnings for a file list, then its error.
     std::vector<std::string> messages(const CorpusCase& c, const std::vector<std::string>& files) {
         std::vector<std::string> args = files;
@@ -79,8 +69,6 @@ protected:
         return out;
     }
 
-    TempDir dir;
-    std::string previous;
 };
 
 TEST_F(ParserCorpusScan, CleanCompilationsScanWithoutMessages) {
