@@ -33,6 +33,24 @@ Port_String Tn_VerilogPort::describe() const { return Port_String::doFormat("por
 
 // -------------------------------------------------------------------- objects
 
+namespace {
+
+// Ranges are asked for their bounds before anything checked them: their names
+// resolve from the declaration's scope.
+void resolveRangeNames(Tn_VerilogRange* r, const Tn_VerilogScope* scope) {
+    if (!r) return;
+    if (r->Msb) r->Msb->resolveNames(scope);
+    if (r->Lsb) r->Lsb->resolveNames(scope);
+}
+
+}  // namespace
+
+void Tn_VerilogObject::prepare() const {
+    if (TypeDef) resolveRangeNames(TypeDef->range(), Parent);
+    if (const Tn_VerilogIODeclaration* io = Tn_VerilogNode::cast<Tn_VerilogIODeclaration>(const_cast<Tn_VerilogObject*>(this)))
+        resolveRangeNames(io->Range, Parent);
+}
+
 Tn_VerilogTypePtr Tn_VerilogObject::check(Tn_VerilogElabContext& ctx) {
     bool ok = checkAttributes(ctx);
     // One type definition may serve several objects: checked once.
@@ -45,14 +63,23 @@ Port_String Tn_VerilogObject::describe() const {
     return Port_String::doFormat("%s '%s'", TypeDef->describe().c_str(), Name.c_str());
 }
 
-Tn_VerilogTypePtr Tn_VerilogObject::type() const { return TypeDef ? TypeDef->type() : Tn_VerilogType::createUnknown(); }
-uint32_t Tn_VerilogObject::width() const { return TypeDef ? TypeDef->width() : 1; }
+Tn_VerilogTypePtr Tn_VerilogObject::type() const {
+    prepare();
+    return TypeDef ? TypeDef->type() : Tn_VerilogType::createUnknown();
+}
+uint32_t Tn_VerilogObject::width() const {
+    prepare();
+    return TypeDef ? TypeDef->width() : 1;
+}
 bool Tn_VerilogObject::isSigned() const { return TypeDef && TypeDef->isSigned(); }
 bool Tn_VerilogObject::isReal() const { return TypeDef && TypeDef->isReal(); }
 bool Tn_VerilogObject::hasFixedSize() const { return !TypeDef || TypeDef->hasFixedSize(); }
 bool Tn_VerilogObject::isNet() const { return TypeDef && TypeDef->isNet(); }
 bool Tn_VerilogObject::isVariable() const { return TypeDef && TypeDef->isVariable(); }
-bool Tn_VerilogObject::bounds(int32_t& msb, int32_t& lsb) const { return TypeDef && TypeDef->bounds(msb, lsb); }
+bool Tn_VerilogObject::bounds(int32_t& msb, int32_t& lsb) const {
+    prepare();
+    return TypeDef && TypeDef->bounds(msb, lsb);
+}
 
 // Variable declaration assignments belong to module items: a reg, integer,
 // time or real variable declared in a module or one of its generate scopes.
@@ -87,6 +114,7 @@ Port_String Tn_VerilogArrayVar::describe() const {
 // The first dimension outermost: mem[0:3][1:2] is an array of arrays.
 Tn_VerilogTypePtr Tn_VerilogArrayVar::type() const {
     Tn_VerilogTypePtr t = Tn_VerilogObject::type();
+    for (Tn_VerilogRange* r : Range) resolveRangeNames(r, Parent);
     for (size_t i = Range.size(); i-- > 0;) {
         int32_t msb = 0, lsb = 0;
         if (Range[i]) Range[i]->bounds(msb, lsb);
@@ -198,7 +226,11 @@ template <class P>
 Tn_VerilogValuePtr guardedValue(const P& p, bool& evaluating) {
     Evaluating guard(evaluating);
     if (!guard.entered()) return Tn_VerilogValue::createNull();
-    return parameterValue(p, p.valueExpression());
+    Tn_VerilogExpression* e = p.valueExpression();
+    // The value may be asked for before anything checked the declaration.
+    if (e) e->resolveNames(p.Parent);
+    if (p.Range) resolveRangeNames(p.Range, p.Parent);
+    return parameterValue(p, e);
 }
 
 template <class P>

@@ -93,7 +93,28 @@ private:
     bool (*test_)(const Tn_VerilogExpression&);
 };
 
+class NameResolver : public Tn_VerilogChildVisitor {
+public:
+    explicit NameResolver(const Tn_VerilogScope* scope) : scope_(scope) {}
+    void eachChild(const Tn_FieldInfo&, Tn_VerilogNode*& child) override {
+        if (Tn_VerilogExpression* e = Tn_VerilogNode::cast<Tn_VerilogExpression>(child)) e->resolveNames(scope_);
+    }
+
+private:
+    const Tn_VerilogScope* scope_;
+};
+
 }  // namespace
+
+// Operands first: the index of an indexed name must have its value before
+// the name can be resolved.
+void Tn_VerilogExpression::resolveNames(const Tn_VerilogScope* scope) {
+    if (!scope) return;
+    NameResolver resolver(scope);
+    visitFields(resolver);
+    if (Tn_VerilogName* n = Tn_VerilogNode::cast<Tn_VerilogName>(this))
+        if (!n->declaration()) n->resolve(scope);
+}
 
 Tn_VerilogExpression* Tn_VerilogExpression::copyWithOperands(Tn_VerilogElabContext& ctx, Tn_VerilogCopyMode mode) {
     Tn_VerilogExpression* copy = static_cast<Tn_VerilogExpression*>(newCopy(ctx.factory()));

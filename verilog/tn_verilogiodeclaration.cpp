@@ -15,6 +15,7 @@ Port_String Tn_VerilogIODeclaration::describe() const {
 }
 
 Tn_VerilogTypePtr Tn_VerilogIODeclaration::type() const {
+    prepare();
     if (TypeDef && (TypeDef->range() || !Range)) return TypeDef->type();
     if (TypeDef && TypeDef->isReal()) return TypeDef->type();
     int32_t msb, lsb;
@@ -23,6 +24,7 @@ Tn_VerilogTypePtr Tn_VerilogIODeclaration::type() const {
 }
 
 uint32_t Tn_VerilogIODeclaration::width() const {
+    prepare();
     if (Tn_VerilogRange* r = effectiveRange()) return r->width();
     return TypeDef ? TypeDef->width() : 1;
 }
@@ -30,6 +32,7 @@ uint32_t Tn_VerilogIODeclaration::width() const {
 bool Tn_VerilogIODeclaration::isSigned() const { return SignedFlag || (TypeDef && TypeDef->isSigned()); }
 
 bool Tn_VerilogIODeclaration::bounds(int32_t& msb, int32_t& lsb) const {
+    prepare();
     if (Tn_VerilogRange* r = effectiveRange()) return r->bounds(msb, lsb);
     return TypeDef ? TypeDef->bounds(msb, lsb) : (msb = lsb = 0, true);
 }

@@ -205,7 +205,9 @@ enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
     bool isVariable() const override;                                                                 \
     bool isNetLValue() const override { return isNet(); }                                             \
     bool isVarLValue() const override { return isVariable(); }                                        \
-    bool bounds(int32_t& msb, int32_t& lsb) const override;
+    bool bounds(int32_t& msb, int32_t& lsb) const override;                                           \
+    /* Resolves the names of the type definition's range from the scope. */                         \
+    void prepare() const;
 
 #define TN_HAS_MEMBERS_GenVar TN_PROBE
 #define TN_MEMBERS_GenVar                                                                             \
@@ -340,6 +342,9 @@ public:
         return Tn_VerilogEvalContext(ctx.report, isSigned(ctx.isSigned), ctx.third, contextWidth(ctx.width)); \
     }                                                                                                 \
                                                                                                       \
+    /* Resolves every name in the expression that is not resolved yet, from */                       \
+    /* scope (for constants evaluated before anything checked them). */                               \
+    void resolveNames(const Tn_VerilogScope* scope);                                                  \
     /* How the operand child is copied when this is copied by mode. */                              \
     virtual Tn_VerilogCopyMode operandCopyMode(const Tn_VerilogNode*, Tn_VerilogCopyMode mode) const { return mode; } \
                                                                                                       \
