@@ -39,8 +39,11 @@ uint32_t widthOf(const Tn_VerilogTypePtr& t) {
 
 }  // namespace
 
+// A call with constant arguments (of a constant function) is constant.
 bool Tn_VerilogFunctionCall::isConstant() const {
-    return allOperands([](const Tn_VerilogExpression& e) { return e.isConstant(); });
+    for (Tn_VerilogExpression* e : Param)
+        if (!e || !e->isConstant()) return false;
+    return true;
 }
 
 Port_String Tn_VerilogFunctionCall::describe() const { return "call to '" + calleeName() + "'"; }
