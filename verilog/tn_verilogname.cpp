@@ -230,6 +230,7 @@ Tn_VerilogDeclaration* Tn_VerilogIndexedName::elementOf(const Tn_VerilogScope* a
 }
 
 Tn_VerilogDeclaration* Tn_VerilogIndexedName::resolve(const Tn_VerilogScope* start) {
+    if (Index) Index->resolveNames(start);
     if (Tn_VerilogDeclaration* d = declaration()) return d;
     if (!Prefix) return nullptr;
     for (const Tn_VerilogScope* s = start; s; s = s->Parent)

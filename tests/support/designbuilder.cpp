@@ -70,7 +70,9 @@ Tn_VerilogModuleInstance* DesignBuilder::instance(Tn_VerilogConcurrentRegion* pa
     inst->DefName = module ? module->DefName : Tn_Symbol(name.c_str());
     inst->Parent = parent;
     inst->Module = module;
+    // As in an elaborated design: the module copy takes the instance's name.
     if (module) {
+        module->Name = inst->Name;
         module->Parent = parent;
         module->Instance = inst;
     }
