@@ -125,6 +125,14 @@ Tn_VerilogTypePtr Tn_VerilogUserFunctionCall::typeAs(Tn_VerilogElabContext& ctx,
 Tn_VerilogValuePtr Tn_VerilogUserFunctionCall::evaluate(const Tn_VerilogEvalContext& ctx) const {
     Tn_VerilogFunction* f = function();
     if (!f) return Tn_VerilogValue::createNull();
+    // Only functions the front end marked for constant use, and whose checks
+    // as constant functions passed, may run here.
+    if (!f->ConstantFlag) {
+        if (ctx.report)
+            TN_MSG().issueError("%sFunction '%s' is not a valid constant function.\n", locationText().c_str(),
+                                calleeName().c_str());
+        return Tn_VerilogValue::createNull();
+    }
     std::vector<Tn_VerilogValuePtr> arguments;
     for (Tn_VerilogExpression* e : Param) {
         Tn_VerilogValuePtr v = e ? e->evaluate(Tn_VerilogEvalContext(ctx.report, true, ctx.third, 0))

@@ -248,6 +248,10 @@ TEST_F(Check, UserFunctionCalls) {
     constant->typeAs(b.context(m), Value);
     sink.clear();
     EXPECT_TRUE(constant->value()->isNull());
+    EXPECT_EQ(errors(), Texts{"\"t.v\" line 1 Function 'f' is not a valid constant function.\n"});
+    f->ConstantFlag = true;
+    sink.clear();
+    EXPECT_TRUE(constant->value()->isNull());
     EXPECT_EQ(errors(), Texts{"\"t.v\" line 1  Unable to evaluate constant function 'f'\n"});
     sink.clear();
     EXPECT_TRUE(constant->evaluate(Tn_VerilogEvalContext::quiet())->isNull());
