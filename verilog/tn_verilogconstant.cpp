@@ -33,14 +33,4 @@ bool Tn_VerilogConstant::isSigned(bool contextSigned) const {
 
 Port_String Tn_VerilogConstant::describe() const { return constantValue()->describe(); }
 
-bool Tn_VerilogConstant::bounds(int32_t& msb, int32_t& lsb) const {
-    Tn_VerilogValuePtr v = constantValue();
-    if (const Tn_VerilogVector* vec = v->vector()) {
-        msb = vec->msb();
-        lsb = vec->lsb();
-        return true;
-    }
-    msb = static_cast<int32_t>(v->width()) - 1;
-    lsb = 0;
-    return true;
-}
+bool Tn_VerilogConstant::bounds(int32_t& msb, int32_t& lsb) const { return boundsOf(constantValue(), msb, lsb); }

@@ -249,16 +249,7 @@ template <class P>
 bool parameterBounds(const P& p, int32_t& msb, int32_t& lsb) {
     if (declaredBounds(p, msb, lsb)) return true;
     if (p.DeclType != NoTypeNoRangeParam && p.DeclType != SignedNoRangeParam) return false;
-    Tn_VerilogValuePtr v = p.value();
-    if (v->isNull() || v->isReal()) return false;
-    if (const Tn_VerilogVector* vec = v->vector()) {
-        msb = vec->msb();
-        lsb = vec->lsb();
-    } else {
-        msb = static_cast<int32_t>(v->width()) - 1;
-        lsb = 0;
-    }
-    return true;
+    return Tn_VerilogExpression::boundsOf(p.value(), msb, lsb);
 }
 
 template <class P>

@@ -51,6 +51,18 @@ uint32_t Tn_VerilogExpression::contextWidth(uint32_t width) const { return width
 
 bool Tn_VerilogExpression::isSigned(bool) const { return false; }
 
+bool Tn_VerilogExpression::boundsOf(const Tn_VerilogValuePtr& v, int32_t& msb, int32_t& lsb) {
+    if (!v || v->isNull() || v->isReal()) return false;
+    if (const Tn_VerilogVector* vec = v->vector()) {
+        msb = vec->msb();
+        lsb = vec->lsb();
+    } else {
+        msb = static_cast<int32_t>(v->width()) - 1;
+        lsb = 0;
+    }
+    return true;
+}
+
 Tn_VerilogExpression* Tn_VerilogExpression::copyAs(Tn_VerilogElabContext& ctx, Tn_VerilogCopyMode mode) {
     return copyWithOperands(ctx, mode);
 }

@@ -179,6 +179,16 @@ Tn_VerilogCopyMode Tn_VerilogHierarchicalName::operandCopyMode(const Tn_VerilogN
     return child && child->isA(HierarchicalName) ? TN_COPY_PLAIN : mode;
 }
 
+Tn_VerilogScope* Tn_VerilogHierarchicalName::resolveScope(const Tn_VerilogScope* start) {
+    Tn_VerilogDeclaration* d = resolve(start);
+    return d ? d->denotedScope() : nullptr;
+}
+
+Tn_VerilogScope* Tn_VerilogHierarchicalName::scope() const {
+    Tn_VerilogDeclaration* d = declaration();
+    return d ? d->denotedScope() : nullptr;
+}
+
 Tn_VerilogScope* Tn_VerilogScopeName::resolveScope(const Tn_VerilogScope* start) {
     Tn_VerilogDeclaration* d = start ? start->lookupScope(Name) : nullptr;
     Tn_VerilogScope* s = d ? d->denotedScope() : nullptr;
@@ -210,16 +220,6 @@ Tn_VerilogDeclaration* Tn_VerilogSelectedName::declaration() const {
     return p ? p->findDeclaration(Suffix) : nullptr;
 }
 
-Tn_VerilogScope* Tn_VerilogSelectedName::resolveScope(const Tn_VerilogScope* start) {
-    Tn_VerilogDeclaration* d = resolve(start);
-    return d ? d->denotedScope() : nullptr;
-}
-
-Tn_VerilogScope* Tn_VerilogSelectedName::scope() const {
-    Tn_VerilogDeclaration* d = declaration();
-    return d ? d->denotedScope() : nullptr;
-}
-
 Port_String Tn_VerilogSelectedName::nameText() const {
     return (Prefix ? Prefix->nameText() : Port_String()) + "." + Suffix.str();
 }
@@ -239,16 +239,6 @@ Tn_VerilogDeclaration* Tn_VerilogIndexedName::resolve(const Tn_VerilogScope* sta
 }
 
 Tn_VerilogDeclaration* Tn_VerilogIndexedName::declaration() const { return elementOf(Prefix ? Prefix->scope() : nullptr); }
-
-Tn_VerilogScope* Tn_VerilogIndexedName::resolveScope(const Tn_VerilogScope* start) {
-    Tn_VerilogDeclaration* d = resolve(start);
-    return d ? d->denotedScope() : nullptr;
-}
-
-Tn_VerilogScope* Tn_VerilogIndexedName::scope() const {
-    Tn_VerilogDeclaration* d = declaration();
-    return d ? d->denotedScope() : nullptr;
-}
 
 Port_String Tn_VerilogIndexedName::nameText() const {
     int32_t index;

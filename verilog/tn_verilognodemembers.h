@@ -170,20 +170,15 @@ enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
 #define TN_HAS_MEMBERS_InstanceArray TN_PROBE
 #define TN_MEMBERS_InstanceArray Tn_VerilogDeclaration* findDeclaration(const Tn_Symbol& name) const override;
 
+#define TN_SCOPE_ARRAY_MEMBERS                                                                        \
+    Port_String describe() const override;                                                            \
+    Tn_VerilogDeclaration* element(int32_t index) const override;
 #define TN_HAS_MEMBERS_ModuleArray TN_PROBE
-#define TN_MEMBERS_ModuleArray                                                                        \
-    Port_String describe() const override;                                                            \
-    Tn_VerilogDeclaration* element(int32_t index) const override;
-
+#define TN_MEMBERS_ModuleArray TN_SCOPE_ARRAY_MEMBERS
 #define TN_HAS_MEMBERS_PrimitiveArray TN_PROBE
-#define TN_MEMBERS_PrimitiveArray                                                                     \
-    Port_String describe() const override;                                                            \
-    Tn_VerilogDeclaration* element(int32_t index) const override;
-
+#define TN_MEMBERS_PrimitiveArray TN_SCOPE_ARRAY_MEMBERS
 #define TN_HAS_MEMBERS_GenerateArray TN_PROBE
-#define TN_MEMBERS_GenerateArray                                                                      \
-    Port_String describe() const override;                                                            \
-    Tn_VerilogDeclaration* element(int32_t index) const override;
+#define TN_MEMBERS_GenerateArray TN_SCOPE_ARRAY_MEMBERS
 
 #define TN_HAS_MEMBERS_ModuleInstance TN_PROBE
 #define TN_MEMBERS_ModuleInstance                                                                     \
@@ -342,6 +337,9 @@ public:
         return Tn_VerilogEvalContext(ctx.report, isSigned(ctx.isSigned), ctx.third, contextWidth(ctx.width)); \
     }                                                                                                 \
                                                                                                       \
+    /* The bounds of a value: a vector's declared ones, else [width-1:0]; */                         \
+    /* false for null and real values. */                                                             \
+    static bool boundsOf(const Tn_VerilogValuePtr& v, int32_t& msb, int32_t& lsb);                    \
     /* Resolves every name in the expression that is not resolved yet, from */                       \
     /* scope (for constants evaluated before anything checked them). */                               \
     void resolveNames(const Tn_VerilogScope* scope);                                                  \
@@ -426,9 +424,9 @@ public:
     /* A prefix is copied plainly: it names a scope, not a value. */                                 \
     Tn_VerilogCopyMode operandCopyMode(const Tn_VerilogNode* child, Tn_VerilogCopyMode mode) const override; \
     /* The scope the name denotes, resolved relative to start; recorded. */                          \
-    virtual Tn_VerilogScope* resolveScope(const Tn_VerilogScope*) { return nullptr; }                 \
+    virtual Tn_VerilogScope* resolveScope(const Tn_VerilogScope* start);                              \
     /* The scope the (resolved) name denotes. */                                                      \
-    virtual Tn_VerilogScope* scope() const { return nullptr; }
+    virtual Tn_VerilogScope* scope() const;
 
 #define TN_HAS_MEMBERS_ScopeName TN_PROBE
 #define TN_MEMBERS_ScopeName                                                                          \
@@ -442,16 +440,12 @@ public:
 #define TN_MEMBERS_SelectedName                                                                       \
     Tn_VerilogDeclaration* resolve(const Tn_VerilogScope* start) override;                            \
     Tn_VerilogDeclaration* declaration() const override;                                              \
-    Tn_VerilogScope* resolveScope(const Tn_VerilogScope* start) override;                             \
-    Tn_VerilogScope* scope() const override;                                                          \
     Port_String nameText() const override;
 
 #define TN_HAS_MEMBERS_IndexedName TN_PROBE
 #define TN_MEMBERS_IndexedName                                                                        \
     Tn_VerilogDeclaration* resolve(const Tn_VerilogScope* start) override;                            \
     Tn_VerilogDeclaration* declaration() const override;                                              \
-    Tn_VerilogScope* resolveScope(const Tn_VerilogScope* start) override;                             \
-    Tn_VerilogScope* scope() const override;                                                          \
     Port_String nameText() const override;                                                            \
     /* The element the constant index selects, or null. */                                           \
     Tn_VerilogDeclaration* elementOf(const Tn_VerilogScope* array) const;

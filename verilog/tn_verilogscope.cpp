@@ -4,8 +4,10 @@
 
 namespace {
 
+// Unnamed items (gate instances may have no name) are never found.
 template <class T>
 Tn_VerilogDeclaration* findIn(const Tn_NodeList<T>& list, const Tn_Symbol& name) {
+    if (name.IsEmpty()) return nullptr;
     for (T* d : list)
         if (d && d->Name == name) return d;
     return nullptr;
@@ -98,28 +100,20 @@ Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findScope(const Tn_Symbol& na
     return nullptr;
 }
 
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findTask(const Tn_Symbol& name) const { return findIn(Task, name); }
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findFunction(const Tn_Symbol& name) const {
-    return findIn(Function, name);
-}
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findModuleInstance(const Tn_Symbol& name) const {
-    return findIn(ModuleInstance, name);
-}
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findModuleArray(const Tn_Symbol& name) const {
-    return findIn(ModuleArray, name);
-}
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findPrimitive(const Tn_Symbol& name) const {
-    return name.IsEmpty() ? nullptr : findIn(Primitive, name);
-}
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findPrimitiveArray(const Tn_Symbol& name) const {
-    return findIn(PrimitiveArray, name);
-}
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findGenerate(const Tn_Symbol& name) const {
-    return findIn(Generate, name);
-}
-Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::findGenerateArray(const Tn_Symbol& name) const {
-    return findIn(GenerateArray, name);
-}
+// Each restricted lookup searches the list of its name.
+#define TN_FIND_IN(List)                                                                         \
+    Tn_VerilogDeclaration* Tn_VerilogConcurrentRegion::find##List(const Tn_Symbol& name) const { \
+        return findIn(List, name);                                                               \
+    }
+TN_FIND_IN(Task)
+TN_FIND_IN(Function)
+TN_FIND_IN(ModuleInstance)
+TN_FIND_IN(ModuleArray)
+TN_FIND_IN(Primitive)
+TN_FIND_IN(PrimitiveArray)
+TN_FIND_IN(Generate)
+TN_FIND_IN(GenerateArray)
+#undef TN_FIND_IN
 
 // The root sees its own declarations only.
 Tn_VerilogDeclaration* Tn_VerilogRoot::lookup(const Tn_Symbol& name, const Tn_VerilogScope** where) const {

@@ -22,15 +22,7 @@ struct Bounds {
         if (operand) known = operand->bounds(msb, lsb);
     }
     Bounds(const Tn_VerilogOperand* operand, const Tn_VerilogValuePtr& v) : Bounds(operand) {
-        if (known || !v || v->isNull()) return;
-        if (const Tn_VerilogVector* vec = v->vector()) {
-            msb = vec->msb();
-            lsb = vec->lsb();
-        } else {
-            msb = static_cast<int32_t>(v->width()) - 1;
-            lsb = 0;
-        }
-        known = true;
+        if (!known) known = Tn_VerilogExpression::boundsOf(v, msb, lsb);
     }
     bool contains(int64_t index) const {
         return msb >= lsb ? index >= lsb && index <= msb : index >= msb && index <= lsb;

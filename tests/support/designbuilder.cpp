@@ -20,55 +20,51 @@ DesignBuilder::DesignBuilder(bool verilog2001)
     unit_.setRoot(root_);
 }
 
+template <class T>
+T* DesignBuilder::declare(Tn_VerilogScope* parent, const std::string& name) {
+    T* d = static_cast<T*>(factory().create(T::TYPE, location_));
+    d->Name = Tn_Symbol(name.c_str());
+    d->Parent = parent;
+    return d;
+}
+
 Tn_VerilogModule* DesignBuilder::module(const std::string& name, Tn_VerilogConcurrentRegion* parent) {
-    Tn_VerilogModule* m = factory().createModule(location_);
-    m->Name = Tn_Symbol(name.c_str());
-    m->DefName = Tn_Symbol(name.c_str());
-    m->Parent = parent ? parent : root_;
+    Tn_VerilogModule* m = declare<Tn_VerilogModule>(parent ? parent : root_, name);
+    m->DefName = m->Name;
     if (!unit_.node()) unit_.setNode(m);
     return m;
 }
 
 Tn_VerilogBlock* DesignBuilder::block(Tn_VerilogRegion* parent, const std::string& name) {
-    Tn_VerilogBlock* b = factory().createBlock(location_);
-    b->Name = Tn_Symbol(name.c_str());
-    b->Parent = parent;
+    Tn_VerilogBlock* b = declare<Tn_VerilogBlock>(parent, name);
     parent->Block.push_back(b);
     return b;
 }
 
 Tn_VerilogTask* DesignBuilder::task(Tn_VerilogConcurrentRegion* parent, const std::string& name) {
-    Tn_VerilogTask* t = factory().createTask(location_);
-    t->Name = Tn_Symbol(name.c_str());
-    t->Parent = parent;
+    Tn_VerilogTask* t = declare<Tn_VerilogTask>(parent, name);
     parent->Task.push_back(t);
     return t;
 }
 
 Tn_VerilogFunction* DesignBuilder::function(Tn_VerilogConcurrentRegion* parent, const std::string& name,
                                             Tn_VerilogNode* returnType) {
-    Tn_VerilogFunction* f = factory().createFunction(location_);
-    f->Name = Tn_Symbol(name.c_str());
-    f->Parent = parent;
+    Tn_VerilogFunction* f = declare<Tn_VerilogFunction>(parent, name);
     f->ReturnType = returnType;
     parent->Function.push_back(f);
     return f;
 }
 
 Tn_VerilogGenerate* DesignBuilder::generate(Tn_VerilogConcurrentRegion* parent, const std::string& name) {
-    Tn_VerilogGenerate* g = factory().createGenerate(location_);
-    g->Name = Tn_Symbol(name.c_str());
-    g->Parent = parent;
+    Tn_VerilogGenerate* g = declare<Tn_VerilogGenerate>(parent, name);
     parent->Generate.push_back(g);
     return g;
 }
 
 Tn_VerilogModuleInstance* DesignBuilder::instance(Tn_VerilogConcurrentRegion* parent, const std::string& name,
                                                   Tn_VerilogModule* module) {
-    Tn_VerilogModuleInstance* inst = factory().createModuleInstance(location_);
-    inst->Name = Tn_Symbol(name.c_str());
-    inst->DefName = module ? module->DefName : Tn_Symbol(name.c_str());
-    inst->Parent = parent;
+    Tn_VerilogModuleInstance* inst = declare<Tn_VerilogModuleInstance>(parent, name);
+    inst->DefName = module ? module->DefName : inst->Name;
     inst->Module = module;
     // As in an elaborated design: the module copy takes the instance's name.
     if (module) {
@@ -111,9 +107,7 @@ Tn_VerilogEvent* DesignBuilder::event() { return factory().createEvent(location_
 
 Tn_VerilogScalarVar* DesignBuilder::var(Tn_VerilogRegion* scope, const std::string& name, Tn_VerilogTypeDef* type,
                                         const std::string& init) {
-    Tn_VerilogScalarVar* v = factory().createScalarVar(location_);
-    v->Name = Tn_Symbol(name.c_str());
-    v->Parent = scope;
+    Tn_VerilogScalarVar* v = declare<Tn_VerilogScalarVar>(scope, name);
     v->TypeDef = type;
     if (!init.empty()) v->InitExpr = expr(init);
     scope->Variable.insert(v->Name, v);
@@ -122,9 +116,7 @@ Tn_VerilogScalarVar* DesignBuilder::var(Tn_VerilogRegion* scope, const std::stri
 
 Tn_VerilogArrayVar* DesignBuilder::array(Tn_VerilogRegion* scope, const std::string& name, Tn_VerilogTypeDef* type,
                                          const std::vector<std::string>& dimensions) {
-    Tn_VerilogArrayVar* a = factory().createArrayVar(location_);
-    a->Name = Tn_Symbol(name.c_str());
-    a->Parent = scope;
+    Tn_VerilogArrayVar* a = declare<Tn_VerilogArrayVar>(scope, name);
     a->TypeDef = type;
     for (const std::string& d : dimensions) a->Range.push_back(range(d));
     scope->Variable.insert(a->Name, a);
@@ -134,9 +126,7 @@ Tn_VerilogArrayVar* DesignBuilder::array(Tn_VerilogRegion* scope, const std::str
 
 Tn_VerilogParameter* DesignBuilder::param(Tn_VerilogRegion* scope, const std::string& name, const std::string& value,
                                           Tn_Verilog::ParamDeclType declType, const std::string& r, bool local) {
-    Tn_VerilogParameter* p = factory().createParameter(location_);
-    p->Name = Tn_Symbol(name.c_str());
-    p->Parent = scope;
+    Tn_VerilogParameter* p = declare<Tn_VerilogParameter>(scope, name);
     p->DeclType = declType;
     p->LocalFlag = local;
     p->SignedFlag = declType == Tn_Verilog::SignedParam || declType == Tn_Verilog::SignedNoRangeParam;
@@ -147,18 +137,14 @@ Tn_VerilogParameter* DesignBuilder::param(Tn_VerilogRegion* scope, const std::st
 }
 
 Tn_VerilogSpecParam* DesignBuilder::specparam(Tn_VerilogModule* scope, const std::string& name, const std::string& value) {
-    Tn_VerilogSpecParam* p = factory().createSpecParam(location_);
-    p->Name = Tn_Symbol(name.c_str());
-    p->Parent = scope;
+    Tn_VerilogSpecParam* p = declare<Tn_VerilogSpecParam>(scope, name);
     p->Expr = expr(value);
     scope->SpecParam.push_back(p);
     return p;
 }
 
 Tn_VerilogGenVar* DesignBuilder::genvar(Tn_VerilogConcurrentRegion* scope, const std::string& name) {
-    Tn_VerilogGenVar* g = factory().createGenVar(location_);
-    g->Name = Tn_Symbol(name.c_str());
-    g->Parent = scope;
+    Tn_VerilogGenVar* g = declare<Tn_VerilogGenVar>(scope, name);
     scope->GenVar.push_back(g);
     return g;
 }
@@ -167,7 +153,7 @@ Tn_VerilogIODeclaration* DesignBuilder::port(Tn_VerilogRegion* scope, Tn_Verilog
                                              Tn_VerilogTypeDef* type, const std::string& r, bool isSigned) {
     Tn_VerilogIODeclaration* io = static_cast<Tn_VerilogIODeclaration*>(factory().create(kind, location_));
     io->Name = Tn_Symbol(name.c_str());
-    io->Parent = scope;
+    io->Parent = scope;  // the direction is the node type: made by type
     io->TypeDef = type;
     io->SignedFlag = isSigned;
     io->TfFlag = scope->isA(Tn_Verilog::Procedure);

@@ -65,6 +65,10 @@ public:
     Tn_VerilogElabContext& context(Tn_VerilogScope* scope);
 
 private:
+    // A declaration named name in parent (not yet entered in its lists).
+    template <class T>
+    T* declare(Tn_VerilogScope* parent, const std::string& name);
+
     Tn_VerilogOptions options_;
     Tn_VerilogDesignUnit unit_;
     Tn_VerilogRoot* root_;

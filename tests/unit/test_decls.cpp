@@ -3,19 +3,13 @@
 // and port redeclarations.
 #include <gtest/gtest.h>
 
-#include "tests/support/capturesink.h"
-#include "tests/support/designbuilder.h"
+#include "tests/support/checkfixture.h"
 
 namespace {
 
 using namespace Tn_Verilog;
-typedef std::vector<std::string> Texts;
 
-struct Decls : ::testing::Test {
-    DesignBuilder b;
-    CaptureSink sink;
-    Tn_VerilogModule* m = b.module("m");
-
+struct Decls : CheckFixture {
     Texts check(Tn_VerilogAttributedNode* n, Tn_VerilogScope* scope = nullptr) {
         sink.clear();
         n->check(b.context(scope ? scope : m));

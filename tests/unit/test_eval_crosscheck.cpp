@@ -10,18 +10,9 @@
 #include <map>
 #include <sstream>
 
-#include "tests/support/capturesink.h"
-#include "tests/support/designbuilder.h"
+#include "tests/support/checkfixture.h"
 
 namespace {
-
-std::string text(const Tn_VerilogValuePtr& v) {
-    if (!v || v->isNull()) return "null";
-    if (v->isReal()) return Port_String::doFormat("real %.17g", v->toReal()).str();
-    return Port_String::doFormat("%u %s %s %s", v->width(), v->isSigned() ? "s" : "u", v->toBinaryText().c_str(),
-                                 v->toDecimalText().c_str())
-        .str();
-}
 
 std::vector<std::string> fields(const std::string& line) {
     std::vector<std::string> r;
@@ -52,7 +43,7 @@ TEST(EvalCrossCheck, AgreesWithIcarusVerilogWhereTheRulesAgree) {
         ++count;
         Tn_VerilogExpression* e = b.expr(f[0]);
         EXPECT_FALSE(e->typeAs(ctx, Tn_Verilog::Value)->isError()) << f[0];
-        const std::string got = text(e->value());
+        const std::string got = valueText(e->value());
         if (record) out << f[0] << '\t' << got << '\n';
         const std::string& expected = f.size() == 4 ? f[2] : f[1];
         EXPECT_EQ(got, expected) << f[0] << "\n  iverilog: " << f[1];

@@ -5,21 +5,16 @@
 
 #include <cctype>
 
-#include "tests/support/capturesink.h"
+#include "tests/support/checkfixture.h"
 #include "util/tn_ostream.h"
-#include "tests/support/designbuilder.h"
 #include "verilog/tn_verilogcallchecker.h"
 #include "verilog/tn_verilogsystf.h"
 
 namespace {
 
 using namespace Tn_Verilog;
-typedef std::vector<std::string> Texts;
 
-struct Check : ::testing::Test {
-    DesignBuilder b;
-    CaptureSink sink;
-    Tn_VerilogModule* m = b.module("m");
+struct Check : CheckFixture {
     Tn_VerilogTask* t = nullptr;
 
     void SetUp() override {
@@ -60,34 +55,28 @@ TEST_F(Check, OperatorTypes) {
 }
 
 TEST_F(Check, IllegalOperandsOfOperators) {
-    const struct {
-        const char* expr;
-        const char* message;
-    } cases[] = {
-        {"~x", "\"t.v\" line 1 Illegal operand of unary operator '~'\n"},
-        {"&x", "\"t.v\" line 1 Illegal operand of unary operator '&'\n"},
-        {"-ev", "\"t.v\" line 1 Illegal operand of unary operator '-'\n"},
-        {"x % 2", "\"t.v\" line 1 Illegal operand(s) of binary operator '%'\n"},
-        {"x << 1", "\"t.v\" line 1 Illegal operand(s) of binary operator '<<'\n"},
-        {"x & r", "\"t.v\" line 1 Illegal operand(s) of binary operator '&'\n"},
-        {"x === 1.0", "\"t.v\" line 1 Illegal operand(s) of binary operator '==='\n"},
-        {"r + ev", "\"t.v\" line 1 Illegal operand(s) of binary operator '+'\n"},
-        {"mem + 1", "\"t.v\" line 1 Illegal operand(s) of binary operator '+'\n"},
-        {"t < 1", "\"t.v\" line 1 Illegal operand(s) of binary operator '<'\n"},
-        {"{r, x}", "\"t.v\" line 1 Illegal operand(s) of concatenation operator\n"},
-        {"{2{x}}", "\"t.v\" line 1 Illegal operand(s) of multiple concatenation operator\n"},
-        {"{x{r}}", "\"t.v\" line 1 Illegal count operand of multiple concatenation operator\n"},
-        {"{r{1'b1}}", "\"t.v\" line 1 Repetition multiplier of multiple concatenation operator should be constant\n"},
-        {"{-1{1'b1}}", "\"t.v\" line 1 Count operand of multiple concatenation operator is negative\n"},
-        {"{2'bx1{1'b1}}", "\"t.v\" line 1 Count operand of multiple concatenation operator is undefined\n"},
-        {"{(1:2:3){1'b1}}", "\"t.v\" line 1 Count operand of multiple concatenation operator could not be evaluated\n"},
-        {"ev ? 1 : 2", "\"t.v\" line 1 Illegal condition operand of conditional operator '?:'\n"},
-        {"r ? ev : 2", "\"t.v\" line 1 Illegal operand of conditional operator '?:'\n"},
-    };
-    for (const auto& c : cases) {
-        EXPECT_EQ(check(c.expr), "error") << c.expr;
-        EXPECT_EQ(errors(), Texts{c.message}) << c.expr;
-    }
+    const std::string L = "\"t.v\" line 1 ";
+    expectMessages({
+        {"~x", Value, L + "Illegal operand of unary operator '~'\n"},
+        {"&x", Value, L + "Illegal operand of unary operator '&'\n"},
+        {"-ev", Value, L + "Illegal operand of unary operator '-'\n"},
+        {"x % 2", Value, L + "Illegal operand(s) of binary operator '%'\n"},
+        {"x << 1", Value, L + "Illegal operand(s) of binary operator '<<'\n"},
+        {"x & r", Value, L + "Illegal operand(s) of binary operator '&'\n"},
+        {"x === 1.0", Value, L + "Illegal operand(s) of binary operator '==='\n"},
+        {"r + ev", Value, L + "Illegal operand(s) of binary operator '+'\n"},
+        {"mem + 1", Value, L + "Illegal operand(s) of binary operator '+'\n"},
+        {"t < 1", Value, L + "Illegal operand(s) of binary operator '<'\n"},
+        {"{r, x}", Value, L + "Illegal operand(s) of concatenation operator\n"},
+        {"{2{x}}", Value, L + "Illegal operand(s) of multiple concatenation operator\n"},
+        {"{x{r}}", Value, L + "Illegal count operand of multiple concatenation operator\n"},
+        {"{r{1'b1}}", Value, L + "Repetition multiplier of multiple concatenation operator should be constant\n"},
+        {"{-1{1'b1}}", Value, L + "Count operand of multiple concatenation operator is negative\n"},
+        {"{2'bx1{1'b1}}", Value, L + "Count operand of multiple concatenation operator is undefined\n"},
+        {"{(1:2:3){1'b1}}", Value, L + "Count operand of multiple concatenation operator could not be evaluated\n"},
+        {"ev ? 1 : 2", Value, L + "Illegal condition operand of conditional operator '?:'\n"},
+        {"r ? ev : 2", Value, L + "Illegal operand of conditional operator '?:'\n"},
+    });
     // Reals are fine where values of any kind are.
     for (const char* ok : {"x + 1", "x == r", "x || 0", "-x", "+x", "x ? x : r", "{3{r}}", "{(P - 1){w}}"}) {
         EXPECT_NE(check(ok), "error") << ok;
@@ -129,43 +118,31 @@ TEST_F(Check, EventOperations) {
 }
 
 TEST_F(Check, SystemFunctionCalls) {
-    const struct {
-        const char* expr;
-        const char* message;  // null: legal
-    } cases[] = {
-        {"$time", nullptr},
-        {"$random", nullptr},
-        {"$random(r)", nullptr},
-        {"$fopen(\"f\")", nullptr},
-        {"$fopen(\"f\", \"r\")", nullptr},
-        {"$dist_uniform(r, 0, 10)", nullptr},
-        {"$signed(r) + 1", nullptr},
-        {"$fscanf(r, \"%d\", r, mem[0])", nullptr},
-        {"$fread(mem, r)", nullptr},
-        {"$realtobits(x)", nullptr},
-        {"$foo(1)", "\"t.v\" line 1 Illegal call to unknown system function '$foo'\n"},
-        {"$display(r)", "\"t.v\" line 1 Call to system function '$display' is unsupported\n"},
-        {"$time(1)", "\"t.v\" line 1 Too many parameters passed to system function '$time'\n"},
-        {"$fopen(\"a\", \"b\", \"c\")", "\"t.v\" line 1 Too many parameters passed to system function '$fopen'\n"},
-        {"$dist_normal(r, 1)", "\"t.v\" line 1 Too few parameters passed to system function '$dist_normal'\n"},
-        {"$fgetc()", "\"t.v\" line 1 Too few parameters passed to system function '$fgetc'\n"},
-        {"$random(3)", "\"t.v\" line 1 Argument 1 (inout) passed to system function '$random' is illegal\n"},
-        {"$ferror(r, 4'd1)", "\"t.v\" line 1 Argument 2 (output) passed to system function '$ferror' is illegal\n"},
-        {"$itor(ev)", "\"t.v\" line 1 Argument 1 (input) passed to system function '$itor' is illegal\n"},
-        {"$ungetc(, r)", "\"t.v\" line 1 Argument 1 (input) passed to system function '$ungetc' is illegal\n"},
-        {"$fscanf(r, \"%d\", 5)", "\"t.v\" line 1 Argument 3 (output) passed to system function '$fscanf' is illegal\n"},
-        {"$random(P)", "\"t.v\" line 1 Reference to name 'P' is not a legal reg or variable lvalue\n"},
-    };
-    for (const auto& c : cases) {
-        const std::string type = check(c.expr);
-        if (c.message) {
-            EXPECT_EQ(type, "error") << c.expr;
-            EXPECT_EQ(errors(), Texts{c.message}) << c.expr;
-        } else {
-            EXPECT_NE(type, "error") << c.expr;
-            EXPECT_TRUE(errors().empty()) << c.expr << ": " << (errors().empty() ? "" : errors()[0]);
-        }
-    }
+    const std::string L = "\"t.v\" line 1 ";
+    expectMessages({
+        {"$time", Value, ""},
+        {"$random", Value, ""},
+        {"$random(r)", Value, ""},
+        {"$fopen(\"f\")", Value, ""},
+        {"$fopen(\"f\", \"r\")", Value, ""},
+        {"$dist_uniform(r, 0, 10)", Value, ""},
+        {"$signed(r) + 1", Value, ""},
+        {"$fscanf(r, \"%d\", r, mem[0])", Value, ""},
+        {"$fread(mem, r)", Value, ""},
+        {"$realtobits(x)", Value, ""},
+        {"$foo(1)", Value, L + "Illegal call to unknown system function '$foo'\n"},
+        {"$display(r)", Value, L + "Call to system function '$display' is unsupported\n"},
+        {"$time(1)", Value, L + "Too many parameters passed to system function '$time'\n"},
+        {"$fopen(\"a\", \"b\", \"c\")", Value, L + "Too many parameters passed to system function '$fopen'\n"},
+        {"$dist_normal(r, 1)", Value, L + "Too few parameters passed to system function '$dist_normal'\n"},
+        {"$fgetc()", Value, L + "Too few parameters passed to system function '$fgetc'\n"},
+        {"$random(3)", Value, L + "Argument 1 (inout) passed to system function '$random' is illegal\n"},
+        {"$ferror(r, 4'd1)", Value, L + "Argument 2 (output) passed to system function '$ferror' is illegal\n"},
+        {"$itor(ev)", Value, L + "Argument 1 (input) passed to system function '$itor' is illegal\n"},
+        {"$ungetc(, r)", Value, L + "Argument 1 (input) passed to system function '$ungetc' is illegal\n"},
+        {"$fscanf(r, \"%d\", 5)", Value, L + "Argument 3 (output) passed to system function '$fscanf' is illegal\n"},
+        {"$random(P)", Value, L + "Reference to name 'P' is not a legal reg or variable lvalue\n"},
+    });
     EXPECT_EQ(check("$realtime"), "real");
     EXPECT_EQ(check("$rtoi(x)"), "signed scalar");
 }
@@ -226,22 +203,16 @@ TEST_F(Check, UserFunctionCalls) {
     EXPECT_TRUE(b.expr("f(1, 2)")->isConstant());
     EXPECT_FALSE(b.expr("f(1, r)")->isConstant());
 
-    const struct {
-        const char* expr;
-        const char* message;
-    } cases[] = {
-        {"g(1)", "\"t.v\" line 1 Illegal function call to 'g'\n"},
-        {"r(1)", "\"t.v\" line 1 Illegal function call to 'r'\n"},
-        {"t(1)", "\"t.v\" line 1 Illegal function call to 't'\n"},
-        {"f(1)", "\"t.v\" line 1 Too few parameters passed to function 'f'\n"},
-        {"f(1, 2, 3)", "\"t.v\" line 1 Too many parameters passed to function 'f'\n"},
-        {"f(ev, 2)", "\"t.v\" line 1 Illegal argument passed to port 1 (input) of function 'f'\n"},
-        {"f(1, mem)", "\"t.v\" line 1 Illegal argument passed to port 2 (input) of function 'f'\n"},
-    };
-    for (const auto& c : cases) {
-        EXPECT_EQ(check(c.expr), "error") << c.expr;
-        EXPECT_EQ(errors(), Texts{c.message}) << c.expr;
-    }
+    const std::string L = "\"t.v\" line 1 ";
+    expectMessages({
+        {"g(1)", Value, L + "Illegal function call to 'g'\n"},
+        {"r(1)", Value, L + "Illegal function call to 'r'\n"},
+        {"t(1)", Value, L + "Illegal function call to 't'\n"},
+        {"f(1)", Value, L + "Too few parameters passed to function 'f'\n"},
+        {"f(1, 2, 3)", Value, L + "Too many parameters passed to function 'f'\n"},
+        {"f(ev, 2)", Value, L + "Illegal argument passed to port 1 (input) of function 'f'\n"},
+        {"f(1, mem)", Value, L + "Illegal argument passed to port 2 (input) of function 'f'\n"},
+    });
     // Constant calls are evaluated by the procedural code's interpreter; until
     // then they have no value, and asking says so.
     Tn_VerilogExpression* constant = b.expr("f(1, 2)");

@@ -3,27 +3,15 @@
 // names of constants, selects, and what is not constant.
 #include <gtest/gtest.h>
 
-#include "tests/support/capturesink.h"
-#include "tests/support/designbuilder.h"
+#include "tests/support/checkfixture.h"
 
 namespace {
 
 using namespace Tn_Verilog;
 
-// "<width> <s|u> <binary> <decimal>", "real <%.17g>" or "null".
-std::string text(const Tn_VerilogValuePtr& v) {
-    if (!v || v->isNull()) return "null";
-    if (v->isReal()) return Port_String::doFormat("real %.17g", v->toReal()).str();
-    return Port_String::doFormat("%u %s %s %s", v->width(), v->isSigned() ? "s" : "u", v->toBinaryText().c_str(),
-                                 v->toDecimalText().c_str())
-        .str();
-}
+std::string text(const Tn_VerilogValuePtr& v) { return valueText(v); }
 
-struct Eval : ::testing::Test {
-    DesignBuilder b;
-    CaptureSink sink;
-    Tn_VerilogModule* m = b.module("m");
-
+struct Eval : CheckFixture {
     // The expression checked in m, then evaluated self-determined.
     std::string eval(const std::string& e) {
         Tn_VerilogExpression* x = b.expr(e);

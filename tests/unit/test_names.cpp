@@ -3,25 +3,13 @@
 // checks for both directions of a declared range.
 #include <gtest/gtest.h>
 
-#include "tests/support/capturesink.h"
-#include "tests/support/designbuilder.h"
+#include "tests/support/checkfixture.h"
 
 namespace {
 
 using namespace Tn_Verilog;
-typedef std::vector<std::string> Texts;
 
-struct Names : ::testing::Test {
-    DesignBuilder b;
-    CaptureSink sink;
-    Tn_VerilogModule* m = b.module("m");
-
-    // Errors of checking e in scope for a use.
-    Texts errorsOf(const std::string& e, Tn_VerilogScope* scope, ValueType use = Value) {
-        sink.clear();
-        b.expr(e)->typeAs(b.context(scope), use);
-        return sink.errors();
-    }
+struct Names : CheckFixture {
     Tn_VerilogDeclaration* resolve(const std::string& e, Tn_VerilogScope* scope) {
         return static_cast<Tn_VerilogName*>(b.expr(e))->resolve(scope);
     }
@@ -171,31 +159,22 @@ TEST_F(Names, LvalueKinds) {
     b.param(m, "P", "1");
     b.port(m, Output, "o", b.reg(), "3:0");
     b.port(m, Input, "in", b.wire());
-    const struct {
-        const char* expr;
-        ValueType use;
-        const char* message;
-    } cases[] = {
-        {"r", VarLValue, nullptr},
-        {"k", VarLValue, nullptr},
-        {"o", VarLValue, nullptr},
-        {"n", NetLValue, nullptr},
-        {"in", NetLValue, nullptr},
-        {"{n, in}", NetLValue, nullptr},
-        {"r", LValue, nullptr},
-        {"n", LValue, nullptr},
+    expectMessages({
+        {"r", VarLValue, ""},
+        {"k", VarLValue, ""},
+        {"o", VarLValue, ""},
+        {"n", NetLValue, ""},
+        {"in", NetLValue, ""},
+        {"{n, in}", NetLValue, ""},
+        {"r", LValue, ""},
+        {"n", LValue, ""},
         {"n", VarLValue, "\"t.v\" line 1 Reference to name 'n' is not a legal reg or variable lvalue\n"},
         {"r", NetLValue, "\"t.v\" line 1 Reference to name 'r' is not a legal net lvalue\n"},
         {"P", LValue, "\"t.v\" line 1 Reference to name 'P' is not a legal lvalue\n"},
         {"ev", LValue, "\"t.v\" line 1 Reference to name 'ev' is not a legal lvalue\n"},
         {"m", LValue, "\"t.v\" line 1 Reference to name 'm' is not a legal lvalue\n"},
         {"{r, n}", VarLValue, "\"t.v\" line 1 Reference to name 'n' is not a legal reg or variable lvalue\n"},
-    };
-    for (const auto& c : cases) {
-        Texts expected;
-        if (c.message) expected.push_back(c.message);
-        EXPECT_EQ(errorsOf(c.expr, m, c.use), expected) << c.expr;
-    }
+    });
     EXPECT_TRUE(b.expr("{r, k}")->isA(ConcatOp));
     Tn_VerilogExpression* both = b.expr("{r, n}");
     both->typeAs(b.context(m), Value);
@@ -212,11 +191,7 @@ TEST_F(Names, SelectChecksForBothRangeDirections) {
     b.var(m, "i", b.integer());
     b.param(m, "P", "3");
     const std::string L = "\"t.v\" line 1 ";
-    const struct {
-        const char* expr;
-        ValueType use;
-        std::string message;
-    } cases[] = {
+    expectMessages({
         {"d[7] + a[0] + d[P] + a[i]", Value, ""},
         {"d[8]", Value, L + "Index in bit-select of name 'd' is out of range\n"},
         {"a[-1]", Value, L + "Index in bit-select of name 'a' is out of range\n"},
@@ -243,12 +218,7 @@ TEST_F(Names, SelectChecksForBothRangeDirections) {
         {"d[0 +: 0]", Value, L + "Width operand in indexed part-select of name 'd' must be > 0\n"},
         {"d[0 +: 9]", Value, L + "Width operand in indexed part-select of name 'd' is out of range\n"},
         {"x[0 +: 1]", Value, L + "Indexed part-select of name 'x' is illegal\n"},
-    };
-    for (const auto& c : cases) {
-        Texts expected;
-        if (!c.message.empty()) expected.push_back(c.message);
-        EXPECT_EQ(errorsOf(c.expr, m, c.use), expected) << c.expr;
-    }
+    });
     EXPECT_EQ(b.expr("d[0]")->isA(BitSelect), true);
     EXPECT_EQ(static_cast<Tn_VerilogOperand*>(b.expr("a[1 +: 2]"))->describe(), "indexed part-select of name 'a'");
     EXPECT_EQ(static_cast<Tn_VerilogOperand*>(b.expr("a[1]"))->describe(), "bit-select of name 'a'");
@@ -261,11 +231,7 @@ TEST_F(Names, WordSelectChecks) {
     b.var(m, "i", b.integer());
     b.param(m, "P", "8'hff");
     const std::string L = "\"t.v\" line 1 ";
-    const struct {
-        const char* expr;
-        ValueType use;
-        std::string message;
-    } cases[] = {
+    expectMessages({
         {"mem[0] + mem[i] + two[1][2] + mem[3][7] + mem[1][3:0]", Value, ""},
         {"mem[i]", VarLValue, ""},
         {"nets[2]", NetLValue, ""},
@@ -278,12 +244,7 @@ TEST_F(Names, WordSelectChecks) {
         {"nets[0]", VarLValue, L + "Reference to word-select of name 'nets' is not a legal reg or variable lvalue\n"},
         {"mem[0][8]", Value, L + "Index in bit-select of word-select of name 'mem' is out of range\n"},
         {"mem", VarLValue, L + "Reference to name 'mem' is not a legal reg or variable lvalue\n"},
-    };
-    for (const auto& c : cases) {
-        Texts expected;
-        if (!c.message.empty()) expected.push_back(c.message);
-        EXPECT_EQ(errorsOf(c.expr, m, c.use), expected) << c.expr;
-    }
+    });
     // Word-selects made by hand: on a non-array, on a parameter, with too few indices.
     auto word = [&](const char* name, int indices) {
         Tn_VerilogWordSelect* w = b.factory().createWordSelect(Tn_Location("t.v", 1));
