@@ -42,8 +42,16 @@ Tn_VerilogTypePtr Tn_VerilogBinaryOp::typeAs(Tn_VerilogElabContext& ctx, ValueTy
                             BinaryOpTypeInfo.text(OpType));
         return Tn_VerilogType::createError();
     }
-    if (isReal()) return Tn_VerilogType::createReal();
-    return Tn_VerilogType::createScalar(isSigned(true));
+    // From the operand types, so that a long operator chain is typed in one pass.
+    switch (groupOf(OpType)) {
+    case Comparison: return Tn_VerilogType::createScalar(false);
+    case LeftOperand:
+        if (l->isRealType() || (OpType == Exponentiation && r->isRealType())) return Tn_VerilogType::createReal();
+        return Tn_VerilogType::createScalar(l->isSignedType());
+    default:
+        if (real) return Tn_VerilogType::createReal();
+        return Tn_VerilogType::createScalar(l->isSignedType() && r->isSignedType());
+    }
 }
 
 Tn_VerilogValuePtr Tn_VerilogBinaryOp::evaluate(const Tn_VerilogEvalContext& ctx) const {
@@ -54,14 +62,14 @@ Tn_VerilogValuePtr Tn_VerilogBinaryOp::evaluate(const Tn_VerilogEvalContext& ctx
         return Tn_VerilogValue::createNull();
     }
     if (!LOperand || !ROperand) return Tn_VerilogValue::createNull();
-    const Tn_VerilogEvalContext self(ctx.report, true, ctx.third, 0);
+    const Tn_VerilogEvalContext self = ctx.selfDetermined();
     switch (groupOf(OpType)) {
     case Comparison: {
         if (OpType == LogicalOr || OpType == LogicalAnd)
             return op(LOperand->evaluate(self), ROperand->evaluate(self), ctx);
         // Operands sized to each other, signed only when both are.
-        const Tn_VerilogEvalContext inner(ctx.report, LOperand->isSigned(true) && ROperand->isSigned(true), ctx.third,
-                                          atLeast(LOperand->contextWidth(0), ROperand->contextWidth(0)));
+        const Tn_VerilogEvalContext inner = ctx.sized(LOperand->isSigned(true) && ROperand->isSigned(true),
+                                                      atLeast(LOperand->contextWidth(0), ROperand->contextWidth(0)));
         if (inner.tooWide()) return Tn_VerilogValue::createNull();
         return op(LOperand->evaluate(inner), ROperand->evaluate(inner), ctx);
     }

@@ -47,7 +47,7 @@ uint32_t operandWidth(const Tn_NodeList<Tn_VerilogExpression>& operands) {
 
 // The operands' self-determined values concatenated, without fitting.
 Tn_VerilogValuePtr concatenate(const Tn_NodeList<Tn_VerilogExpression>& operands, const Tn_VerilogEvalContext& ctx) {
-    const Tn_VerilogEvalContext self(ctx.report, true, ctx.third, 0);
+    const Tn_VerilogEvalContext self = ctx.selfDetermined();
     std::vector<Tn_VerilogValuePtr> values;
     values.reserve(operands.size());
     for (Tn_VerilogExpression* e : operands) {
@@ -55,7 +55,7 @@ Tn_VerilogValuePtr concatenate(const Tn_NodeList<Tn_VerilogExpression>& operands
         if (isEmptyReplication(e)) continue;
         values.push_back(e->evaluate(self));
     }
-    return Tn_VerilogValue::concatenation(values, Tn_VerilogEvalContext(ctx.report, false, ctx.third, 0));
+    return Tn_VerilogValue::concatenation(values, ctx.sized(false, 0));
 }
 
 bool allLValues(const Tn_NodeList<Tn_VerilogExpression>& operands, bool (Tn_VerilogExpression::*test)() const) {

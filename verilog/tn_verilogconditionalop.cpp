@@ -23,13 +23,13 @@ Tn_VerilogTypePtr Tn_VerilogConditionalOp::typeAs(Tn_VerilogElabContext& ctx, Va
         return Tn_VerilogType::createError();
     }
     if (failed) return Tn_VerilogType::createError();
-    if (isReal()) return Tn_VerilogType::createReal();
-    return Tn_VerilogType::createScalar(isSigned(true));
+    if (t->isRealType() || f->isRealType()) return Tn_VerilogType::createReal();
+    return Tn_VerilogType::createScalar(t->isSignedType() && f->isSignedType());
 }
 
 Tn_VerilogValuePtr Tn_VerilogConditionalOp::evaluate(const Tn_VerilogEvalContext& ctx) const {
     if (!Condition || !TrueOperand || !FalseOperand) return Tn_VerilogValue::createNull();
-    Tn_VerilogValuePtr c = Condition->evaluate(Tn_VerilogEvalContext(ctx.report, true, ctx.third, 0));
+    Tn_VerilogValuePtr c = Condition->evaluate(ctx.selfDetermined());
     if (c->isNull()) return c;
     const Tn_VerilogEvalContext inner = operandContext(ctx);
     if (inner.tooWide()) return Tn_VerilogValue::createNull();

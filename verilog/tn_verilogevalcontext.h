@@ -1,6 +1,6 @@
 // What an expression is evaluated for: passed by value down the operand tree.
-// Values read only the signed flag and the width; report and the reserved
-// third flag belong to expression evaluation.
+// Values read only the signed flag and the width; the other two flags belong
+// to expression evaluation.
 #ifndef TARN_TN_VERILOGEVALCONTEXT_H
 #define TARN_TN_VERILOGEVALCONTEXT_H
 
@@ -13,14 +13,24 @@ struct Tn_VerilogEvalContext {
     // reported once per query.
     bool report;
     bool isSigned;  // the enclosing context is signed
-    // Reserved: no evaluation reads it yet; operations pass it on unchanged.
-    bool third;
+    // The expression sizes itself (computes its own width and sign in this
+    // context): true for the root and for self-determined operands. An
+    // operator that has sized a context-determined operand already passes
+    // false, so that a deep expression is not sized again at every level.
+    bool sizeItself;
     uint32_t width;  // width the context requires
 
     // The default context: self-determined evaluation.
-    Tn_VerilogEvalContext() : report(true), isSigned(true), third(true), width(0) {}
-    Tn_VerilogEvalContext(bool report_, bool isSigned_, bool third_, uint32_t width_)
-        : report(report_), isSigned(isSigned_), third(third_), width(width_) {}
+    Tn_VerilogEvalContext() : report(true), isSigned(true), sizeItself(true), width(0) {}
+    Tn_VerilogEvalContext(bool report_, bool isSigned_, bool sizeItself_, uint32_t width_)
+        : report(report_), isSigned(isSigned_), sizeItself(sizeItself_), width(width_) {}
+
+    // The context of a self-determined operand.
+    Tn_VerilogEvalContext selfDetermined() const { return Tn_VerilogEvalContext(report, true, true, 0); }
+    // The context of an operand sized by its operator.
+    Tn_VerilogEvalContext sized(bool isSigned_, uint32_t width_) const {
+        return Tn_VerilogEvalContext(report, isSigned_, false, width_);
+    }
 
     // Constant evaluation stops (the value is null) where a context or a
     // result would be wider than this: 16M bits, 2 MB a vector.

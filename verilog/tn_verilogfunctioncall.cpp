@@ -135,7 +135,7 @@ Tn_VerilogValuePtr Tn_VerilogUserFunctionCall::evaluate(const Tn_VerilogEvalCont
     }
     std::vector<Tn_VerilogValuePtr> arguments;
     for (Tn_VerilogExpression* e : Param) {
-        Tn_VerilogValuePtr v = e ? e->evaluate(Tn_VerilogEvalContext(ctx.report, true, ctx.third, 0))
+        Tn_VerilogValuePtr v = e ? e->evaluate(ctx.selfDetermined())
                                  : Tn_VerilogValue::createNull();
         if (v->isNull()) return v;
         arguments.push_back(v);

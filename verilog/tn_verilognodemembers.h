@@ -332,9 +332,10 @@ public:
     virtual bool isVarLValue() const { return false; }                                                \
     /* The copy of the three copy operations: operands by the same mode. */                          \
     virtual Tn_VerilogExpression* copyAs(Tn_VerilogElabContext& ctx, Tn_VerilogCopyMode mode);        \
-    /* The context of a context-determined operand: own width and sign. */                           \
+    /* The context of a context-determined operand: own width and sign, */                          \
+    /* unless the context is sized already. */                                                        \
     Tn_VerilogEvalContext operandContext(const Tn_VerilogEvalContext& ctx) const {                    \
-        return Tn_VerilogEvalContext(ctx.report, isSigned(ctx.isSigned), ctx.third, contextWidth(ctx.width)); \
+        return ctx.sizeItself ? ctx.sized(isSigned(ctx.isSigned), contextWidth(ctx.width)) : ctx;       \
     }                                                                                                 \
                                                                                                       \
     /* The bounds of a value: a vector's declared ones, else [width-1:0]; */                         \

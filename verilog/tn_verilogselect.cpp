@@ -76,7 +76,7 @@ Tn_VerilogValuePtr allX(uint64_t width) {
 // The operand's self-determined value when it can be selected from.
 Tn_VerilogValuePtr selectable(const Tn_VerilogExpression* operand, const Tn_VerilogEvalContext& ctx) {
     if (!operand) return Tn_VerilogValuePtr();
-    Tn_VerilogValuePtr v = operand->evaluate(Tn_VerilogEvalContext(ctx.report, true, ctx.third, 0));
+    Tn_VerilogValuePtr v = operand->evaluate(ctx.selfDetermined());
     return v->isNull() || v->isReal() ? Tn_VerilogValuePtr() : v;
 }
 

@@ -16,8 +16,9 @@ Tn_VerilogTypePtr Tn_VerilogUnaryOp::typeAs(Tn_VerilogElabContext& ctx, ValueTyp
                             UnaryOpTypeInfo.text(OpType));
         return Tn_VerilogType::createError();
     }
-    if (isReal()) return Tn_VerilogType::createReal();
-    return Tn_VerilogType::createScalar(isSigned(true));
+    if (isBitResult()) return Tn_VerilogType::createScalar(false);
+    if (t->isRealType()) return Tn_VerilogType::createReal();
+    return Tn_VerilogType::createScalar(t->isSignedType());
 }
 
 Tn_VerilogValuePtr Tn_VerilogUnaryOp::evaluate(const Tn_VerilogEvalContext& ctx) const {
@@ -29,7 +30,7 @@ Tn_VerilogValuePtr Tn_VerilogUnaryOp::evaluate(const Tn_VerilogEvalContext& ctx)
     }
     if (!Operand) return Tn_VerilogValue::createNull();
     // The operand of ! and of the reductions is self-determined.
-    if (isBitResult()) return op(Operand->evaluate(Tn_VerilogEvalContext(ctx.report, true, ctx.third, 0)), ctx);
+    if (isBitResult()) return op(Operand->evaluate(ctx.selfDetermined()), ctx);
     Tn_VerilogEvalContext inner = operandContext(ctx);
     if (inner.tooWide()) return Tn_VerilogValue::createNull();
     return op(Operand->evaluate(inner), inner);

@@ -122,6 +122,17 @@ TEST_F(Eval, RealsAndMixedOperands) {
     EXPECT_EQ(checked("1.0")->contextWidth(0), 64u);
 }
 
+TEST_F(Eval, LongOperatorChains) {
+    std::string sum = "8'd1", nested = "4'sd1";
+    for (int i = 1; i < 3000; ++i) sum += " + 8'd1";
+    for (int i = 0; i < 1000; ++i) nested = "-(" + nested + ")";
+    Tn_VerilogExpression* e = checked(sum);
+    EXPECT_EQ(e->contextWidth(0), 8u);
+    EXPECT_EQ(text(e->value()), "8 u 10111000 184");  // 3000 mod 256
+    EXPECT_EQ(eval(nested), "4 s 0001 1");
+    EXPECT_TRUE(sink.errors().empty());
+}
+
 TEST_F(Eval, WhatIsNotConstantHasNoValue) {
     EXPECT_EQ(eval("(1:2:3)"), "null");
     EXPECT_EQ(eval("$signed(4'b1111)"), "null");
