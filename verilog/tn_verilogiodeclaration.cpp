@@ -41,7 +41,9 @@ bool Tn_VerilogIODeclaration::bounds(int32_t& msb, int32_t& lsb) const {
 // and the range the redeclaration overrides.
 Tn_VerilogTypePtr Tn_VerilogIODeclaration::check(Tn_VerilogElabContext& ctx) {
     bool ok = checkAttributes(ctx);
-    if (Range && ctx.firstCheck(Range) && Range->check(ctx)->isError()) ok = false;
+    // A range shared with the type definition is checked with it.
+    const bool ownRange = Range && (!TypeDef || TypeDef->range() != Range.get());
+    if (ownRange && ctx.firstCheck(Range) && Range->check(ctx)->isError()) ok = false;
     if (!TypeDef) return ok ? Tn_VerilogType::createVoid() : Tn_VerilogType::createError();
     if (ctx.firstCheck(TypeDef) && TypeDef->check(ctx)->isError()) ok = false;
 
