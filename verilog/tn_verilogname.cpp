@@ -85,6 +85,8 @@ Tn_VerilogTypePtr Tn_VerilogName::typeAs(Tn_VerilogElabContext& ctx, ValueType u
         TN_MSG().issueError(problem, loc.c_str(), describe().c_str());
         return Tn_VerilogType::createError();
     }
+    // Inside a function its name is the result variable.
+    if (isFunctionResult(d)) return static_cast<Tn_VerilogFunction*>(d)->resultType();
     return d->type();
 }
 
@@ -145,7 +147,7 @@ bool Tn_VerilogName::isNetLValue() const {
 
 bool Tn_VerilogName::isVarLValue() const {
     Tn_VerilogDeclaration* d = declaration();
-    return d && d->isVarLValue();
+    return d && (d->isVarLValue() || isFunctionResult(d));
 }
 
 Port_String Tn_VerilogName::describe() const { return "name '" + nameText() + "'"; }

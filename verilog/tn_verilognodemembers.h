@@ -156,6 +156,15 @@ enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
 #define TN_MEMBERS_Function                                                                           \
     Port_String describe() const override;                                                            \
     Tn_VerilogTypePtr type() const override;                                                          \
+    /* Inside the function its name stands for the result variable: the */                          \
+    /* function declares itself, and sizes like its result. */                                       \
+    Tn_VerilogDeclaration* findObject(const Tn_Symbol& name) const override;                          \
+    uint32_t width() const override;                                                                  \
+    bool isSigned() const override;                                                                   \
+    bool isReal() const override;                                                                     \
+    bool bounds(int32_t& msb, int32_t& lsb) const override;                                           \
+    /* The result's type definition (a reg, integer, real ...) or range, as written. */              \
+    Tn_VerilogTypePtr resultType() const;                                                             \
     /* The value a call with constant arguments returns; null until constant */                      \
     /* functions can be run. */                                                                       \
     Tn_VerilogValuePtr evaluateConstantCall(const std::vector<Tn_VerilogValuePtr>& arguments,         \
@@ -412,11 +421,17 @@ public:
         return Tn_VerilogNode::cast<T>(declaration());                                                \
     }                                                                                                 \
     /* The name as written ("a", "top.u1.w", "g[2].x"). */                                           \
-    virtual Port_String nameText() const { return Port_String(); }
+    virtual Port_String nameText() const { return Port_String(); }                                    \
+    /* Whether the name stands for the result variable of the function d */                          \
+    /* (d's own name used inside d). */                                                               \
+    virtual bool isFunctionResult(const Tn_VerilogDeclaration*) const { return false; }
 
 #define TN_HAS_MEMBERS_SimpleName TN_PROBE
 #define TN_MEMBERS_SimpleName                                                                         \
     Tn_VerilogDeclaration* resolve(const Tn_VerilogScope* start) override;                            \
+    bool isFunctionResult(const Tn_VerilogDeclaration* d) const override {                            \
+        return d && Scope.get() == d && d->isA(Tn_Verilog::Function);                                  \
+    }                                                                                                 \
     Tn_VerilogDeclaration* declaration() const override;                                              \
     Port_String nameText() const override { return Name.str(); }
 

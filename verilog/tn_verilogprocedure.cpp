@@ -29,17 +29,46 @@ Port_String Tn_VerilogFunction::describe() const { return Port_String::doFormat(
 
 // The result is written as a type definition (a ranged reg, integer, real...)
 // or as a bare range; without either it is one unsigned bit.
-Tn_VerilogTypePtr Tn_VerilogFunction::type() const {
-    Tn_VerilogTypePtr result;
+Tn_VerilogTypePtr Tn_VerilogFunction::resultType() const {
     if (Tn_VerilogTypeDef* t = Tn_VerilogNode::cast<Tn_VerilogTypeDef>(ReturnType)) {
-        result = t->type();
-    } else if (Tn_VerilogRange* r = Tn_VerilogNode::cast<Tn_VerilogRange>(ReturnType)) {
-        int32_t msb, lsb;
-        result = r->bounds(msb, lsb) ? Tn_VerilogType::createVector(false, msb, lsb) : Tn_VerilogType::createScalar(false);
-    } else {
-        result = Tn_VerilogType::createScalar(false);
+        if (Tn_VerilogRange* r = t->range()) {
+            if (r->Msb) r->Msb->resolveNames(Parent);
+            if (r->Lsb) r->Lsb->resolveNames(Parent);
+        }
+        return t->type();
     }
-    return Tn_VerilogType::createFunction(result, argumentTypes(*this));
+    if (Tn_VerilogRange* r = Tn_VerilogNode::cast<Tn_VerilogRange>(ReturnType)) {
+        int32_t msb, lsb;
+        if (r->Msb) r->Msb->resolveNames(Parent);
+        if (r->Lsb) r->Lsb->resolveNames(Parent);
+        if (r->bounds(msb, lsb)) return Tn_VerilogType::createVector(false, msb, lsb);
+    }
+    return Tn_VerilogType::createScalar(false);
+}
+
+Tn_VerilogTypePtr Tn_VerilogFunction::type() const { return Tn_VerilogType::createFunction(resultType(), argumentTypes(*this)); }
+
+Tn_VerilogDeclaration* Tn_VerilogFunction::findObject(const Tn_Symbol& name) const {
+    if (Tn_VerilogDeclaration* d = Tn_VerilogRegion::findObject(name)) return d;
+    return name == Name ? const_cast<Tn_VerilogFunction*>(this) : nullptr;
+}
+
+uint32_t Tn_VerilogFunction::width() const {
+    Tn_VerilogTypePtr t = resultType();
+    if (t->isRealType()) return 64;
+    const int64_t span = static_cast<int64_t>(t->msb()) - t->lsb();
+    return static_cast<uint32_t>(span < 0 ? -span : span) + 1;
+}
+
+bool Tn_VerilogFunction::isSigned() const { return resultType()->isSignedType() || resultType()->isRealType(); }
+bool Tn_VerilogFunction::isReal() const { return resultType()->isRealType(); }
+
+bool Tn_VerilogFunction::bounds(int32_t& msb, int32_t& lsb) const {
+    Tn_VerilogTypePtr t = resultType();
+    if (t->isRealType()) return false;
+    msb = t->msb();
+    lsb = t->lsb();
+    return true;
 }
 
 // Constant functions are run by the procedural code's interpreter; until it

@@ -54,6 +54,25 @@ TEST_F(Names, AModulesOwnNameDenotesTheModule) {
     EXPECT_TRUE(m->lookupScope("m") == m);
 }
 
+TEST_F(Names, AFunctionsNameInsideItIsItsResult) {
+    Tn_VerilogFunction* f = b.function(m, "f", b.reg("7:0", true));
+    b.port(f, Input, "x", b.reg("7:0"), "7:0");
+    Tn_VerilogBlock* body = b.block(f, "body");
+    // Assigned and read inside, as a signed 8-bit variable.
+    EXPECT_TRUE(errorsOf("f", body, VarLValue).empty());
+    EXPECT_EQ(checked->text().str(), "signed [7:0]");
+    Tn_VerilogExpression* e = b.expr("f + 8'sd1");
+    e->typeAs(b.context(f), Value);
+    EXPECT_EQ(e->contextWidth(0), 8u);
+    EXPECT_TRUE(e->isSigned(true));
+    EXPECT_EQ(errorsOf("f", f, NetLValue), Texts{"\"t.v\" line 1 Reference to name 'f' is not a legal net lvalue\n"});
+    // Outside it, the name is the function, not a variable.
+    EXPECT_EQ(errorsOf("f", m, VarLValue), Texts{"\"t.v\" line 1 Reference to name 'f' is not a legal reg or variable lvalue\n"});
+    EXPECT_EQ(errorsOf("f + 1", m), Texts{"\"t.v\" line 1 Illegal operand(s) of binary operator '+'\n"});
+    // A recursive call inside still calls it.
+    EXPECT_TRUE(errorsOf("f(x - 1)", body).empty());
+}
+
 TEST_F(Names, WhatScopesDeclare) {
     Tn_VerilogIODeclaration* in = b.port(m, Input, "a", b.wire());
     b.var(m, "a", b.reg());  // the redeclaration: the port is found first
