@@ -46,7 +46,7 @@ void resolveRangeNames(Tn_VerilogRange* r, const Tn_VerilogScope* scope) {
 }  // namespace
 
 void Tn_VerilogObject::prepare() const {
-    if (TypeDef) resolveRangeNames(TypeDef->range(), Parent);
+    if (Tn_VerilogTypeDef* t = typeDef()) resolveRangeNames(t->range(), Parent);
     if (const Tn_VerilogIODeclaration* io = Tn_VerilogNode::cast<Tn_VerilogIODeclaration>(const_cast<Tn_VerilogObject*>(this)))
         resolveRangeNames(io->Range, Parent);
 }
@@ -54,31 +54,31 @@ void Tn_VerilogObject::prepare() const {
 Tn_VerilogTypePtr Tn_VerilogObject::check(Tn_VerilogElabContext& ctx) {
     bool ok = checkAttributes(ctx);
     // One type definition may serve several objects: checked once.
-    if (TypeDef && ctx.firstCheck(TypeDef) && TypeDef->check(ctx)->isError()) ok = false;
+    if (typeDef() && ctx.firstCheck(typeDef()) && typeDef()->check(ctx)->isError()) ok = false;
     return ok ? Tn_VerilogType::createVoid() : Tn_VerilogType::createError();
 }
 
 Port_String Tn_VerilogObject::describe() const {
-    if (!TypeDef) return Tn_VerilogDeclaration::describe();
-    return Port_String::doFormat("%s '%s'", TypeDef->describe().c_str(), Name.c_str());
+    if (!typeDef()) return Tn_VerilogDeclaration::describe();
+    return Port_String::doFormat("%s '%s'", typeDef()->describe().c_str(), Name.c_str());
 }
 
 Tn_VerilogTypePtr Tn_VerilogObject::type() const {
     prepare();
-    return TypeDef ? TypeDef->type() : Tn_VerilogType::createUnknown();
+    return typeDef() ? typeDef()->type() : Tn_VerilogType::createUnknown();
 }
 uint32_t Tn_VerilogObject::width() const {
     prepare();
-    return TypeDef ? TypeDef->width() : 1;
+    return typeDef() ? typeDef()->width() : 1;
 }
-bool Tn_VerilogObject::isSigned() const { return TypeDef && TypeDef->isSigned(); }
-bool Tn_VerilogObject::isReal() const { return TypeDef && TypeDef->isReal(); }
-bool Tn_VerilogObject::hasFixedSize() const { return !TypeDef || TypeDef->hasFixedSize(); }
-bool Tn_VerilogObject::isNet() const { return TypeDef && TypeDef->isNet(); }
-bool Tn_VerilogObject::isVariable() const { return TypeDef && TypeDef->isVariable(); }
+bool Tn_VerilogObject::isSigned() const { return typeDef() && typeDef()->isSigned(); }
+bool Tn_VerilogObject::isReal() const { return typeDef() && typeDef()->isReal(); }
+bool Tn_VerilogObject::hasFixedSize() const { return !typeDef() || typeDef()->hasFixedSize(); }
+bool Tn_VerilogObject::isNet() const { return typeDef() && typeDef()->isNet(); }
+bool Tn_VerilogObject::isVariable() const { return typeDef() && typeDef()->isVariable(); }
 bool Tn_VerilogObject::bounds(int32_t& msb, int32_t& lsb) const {
     prepare();
-    return TypeDef && TypeDef->bounds(msb, lsb);
+    return typeDef() && typeDef()->bounds(msb, lsb);
 }
 
 // Variable declaration assignments belong to module items: a reg, integer,
@@ -108,7 +108,7 @@ Tn_VerilogTypePtr Tn_VerilogArrayVar::check(Tn_VerilogElabContext& ctx) {
 }
 
 Port_String Tn_VerilogArrayVar::describe() const {
-    return Port_String::doFormat("%s array '%s'", TypeDef ? TypeDef->describe().c_str() : "", Name.c_str());
+    return Port_String::doFormat("%s array '%s'", typeDef() ? typeDef()->describe().c_str() : "", Name.c_str());
 }
 
 // The first dimension outermost: mem[0:3][1:2] is an array of arrays.

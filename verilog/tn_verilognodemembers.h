@@ -198,6 +198,8 @@ enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
 // Objects forward their properties to their type definition.
 #define TN_HAS_MEMBERS_Object TN_PROBE
 #define TN_MEMBERS_Object                                                                             \
+    /* The type definition in force (a port's is its redeclaration's). */                            \
+    virtual Tn_VerilogTypeDef* typeDef() const { return TypeDef; }                                    \
     Tn_VerilogTypePtr check(Tn_VerilogElabContext& ctx) override;                                     \
     Port_String describe() const override;                                                            \
     Tn_VerilogTypePtr type() const override;                                                          \
@@ -275,6 +277,9 @@ public:
 
 #define TN_HAS_MEMBERS_IODeclaration TN_PROBE
 #define TN_MEMBERS_IODeclaration                                                                      \
+    Tn_VerilogTypeDef* typeDef() const override;                                                      \
+    /* The net or variable declaration of the same name in the scope, or null. */                    \
+    Tn_VerilogVariable* redeclaration() const;                                                        \
     Tn_VerilogTypePtr check(Tn_VerilogElabContext& ctx) override;                                     \
     Port_String describe() const override;                                                            \
     Tn_VerilogTypePtr type() const override;                                                          \

@@ -3,6 +3,7 @@
 #include <initializer_list>
 
 #include "util/tn_message.h"
+#include "util/tn_messagecheckpoint.h"
 #include "verilog/tn_verilogelabcontext.h"
 #include "verilog/tn_verilognodes.h"
 
@@ -24,10 +25,22 @@ bool checkBound(Tn_VerilogElabContext& ctx, Tn_VerilogExpression* e, const char*
     const Port_String loc = range.locationText();
     const char* problem = nullptr;
     Tn_VerilogValuePtr v;
-    if (t->isRealType()) problem = "must be an integer";
-    else if (!e->isConstant() || (v = e->evaluate(Tn_VerilogEvalContext::quiet()))->isNull()) problem = "must be constant";
-    else if (v->isReal()) problem = "must be an integer";
-    else if (v->hasUnknown()) problem = "is undefined";
+    if (t->isRealType()) {
+        problem = "must be an integer";
+    } else if (!e->isConstant()) {
+        problem = "must be constant";
+    } else if ((v = e->evaluate(Tn_VerilogEvalContext::quiet()))->isNull()) {
+        // A constant that cannot be computed: evaluating again says why (a
+        // constant function that fails, say), or else it is not constant.
+        Tn_MessageCheckpoint checkpoint;
+        e->value();
+        if (checkpoint.errorsIssued()) return false;
+        problem = "must be constant";
+    } else if (v->isReal()) {
+        problem = "must be an integer";
+    } else if (v->hasUnknown()) {
+        problem = "is undefined";
+    }
     if (!problem) return true;
     TN_MSG().issueError("%s%s of range specification %s\n", loc.c_str(), which, problem);
     return false;

@@ -231,14 +231,17 @@ Tn_VerilogTypePtr Tn_VerilogIndexedPartSelect::typeAs(Tn_VerilogElabContext& ctx
     if (!c.check(Width, widthPrefix, true, true, width)) ok = false;
     if (!ok) return Tn_VerilogType::createError();
     Bounds b(Operand);
-    if (base.state == IndexValue::Defined && b.known && !b.contains(base.value)) ok = c.report(basePrefix, "is out of range");
-    if (width.state == IndexValue::Defined) {
-        if (width.value <= 0) {
-            ok = c.report(widthPrefix, "must be > 0");
-        } else if (b.known) {
-            const int64_t span = static_cast<int64_t>(b.msb) - b.lsb;
-            if (width.value > (span < 0 ? -span : span) + 1) ok = c.report(widthPrefix, "is out of range");
-        }
+    const bool baseDefined = base.state == IndexValue::Defined;
+    if (baseDefined && b.known && !b.contains(base.value)) {
+        ok = c.report(basePrefix, "is out of range");
+    } else if (width.state == IndexValue::Defined) {
+        // The width runs out of range when the selection leaves the declared
+        // bits: from a known base, or wider than the operand from any base.
+        const int64_t span = static_cast<int64_t>(b.msb) - b.lsb;
+        const int64_t end = NegativeFlag ? base.value - width.value + 1 : base.value + width.value - 1;
+        if (width.value <= 0) ok = c.report(widthPrefix, "must be > 0");
+        else if (b.known && (baseDefined ? !b.contains(end) : width.value > (span < 0 ? -span : span) + 1))
+            ok = c.report(widthPrefix, "is out of range");
     }
     return ok ? Tn_VerilogType::createScalar(false) : Tn_VerilogType::createError();
 }
