@@ -77,7 +77,14 @@ Tn_VerilogModuleInstance* DesignBuilder::instance(Tn_VerilogConcurrentRegion* pa
 }
 
 Tn_VerilogRange* DesignBuilder::range(const std::string& text) {
-    const size_t colon = text.find(':');
+    // The colon outside parentheses separates the bounds.
+    size_t colon = std::string::npos;
+    int depth = 0;
+    for (size_t i = 0; i < text.size() && colon == std::string::npos; ++i) {
+        if (text[i] == '(') ++depth;
+        if (text[i] == ')') --depth;
+        if (text[i] == ':' && depth == 0) colon = i;
+    }
     if (colon == std::string::npos) throw std::invalid_argument("range without ':': " + text);
     Tn_VerilogRange* r = factory().createRange(location_);
     r->Msb = expr(text.substr(0, colon));

@@ -139,6 +139,12 @@ TEST_F(Decls, RangeChecks) {
         if (!c.message.empty()) expected.push_back(c.message);
         EXPECT_EQ(check(x), expected) << c.range;
     }
+    // A constant that cannot be computed says why.
+    Tn_VerilogFunction* f = b.function(m, "f", b.integer());
+    f->ConstantFlag = true;
+    b.port(f, Input, "n", b.integer());
+    EXPECT_EQ(check(b.var(m, "y", b.reg("f(3):0"))), Texts{L + " Unable to evaluate constant function 'f'\n"});
+    EXPECT_EQ(check(b.var(m, "z", b.reg("(1:2:3):0"))), Texts{L + "Most significant bit of range specification must be constant\n"});
     // A type definition shared by several objects is checked once.
     Tn_VerilogReg* shared = b.reg("4'bx00:0");
     Tn_VerilogScalarVar* a = b.var(m, "a", shared);
@@ -201,6 +207,21 @@ TEST_F(Decls, VariableInitialisation) {
     EXPECT_TRUE(check(b.var(g, "ok", b.reg(), "1"), g).empty());
     EXPECT_EQ(check(b.var(m, "bad", b.reg(), "1.5 % 2")),
               Texts{"\"t.v\" line 1 Illegal operand(s) of binary operator '%'\n"});
+}
+
+TEST_F(Decls, APortIsTypedByItsRedeclaration) {
+    // An argument declared with a direction gets an implicit reg; declared
+    // again as an integer it is an integer.
+    Tn_VerilogTask* t = b.task(m, "t");
+    Tn_VerilogIODeclaration* x = b.port(t, Input, "x", b.reg());
+    b.var(t, "x", b.integer());
+    EXPECT_EQ(x->typeDef()->describe().str(), "integer variable");
+    EXPECT_EQ(x->width(), 32u);
+    EXPECT_TRUE(x->isSigned());
+    EXPECT_TRUE(check(x, t).empty());
+    Tn_VerilogIODeclaration* y = b.port(t, Input, "y", b.reg(), "7:0");
+    b.var(t, "y", b.integer());
+    EXPECT_EQ(check(y, t), Texts{"\"t.v\" line 1 Illegal redeclaration of vector input 'y' as an integer variable\n"});
 }
 
 TEST_F(Decls, PortDescriptionsAndTypes) {

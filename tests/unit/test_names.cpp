@@ -236,6 +236,10 @@ TEST_F(Names, SelectChecksForBothRangeDirections) {
         {"d[0 +: 1'bx]", Value, L + "Width operand in indexed part-select of name 'd' is undefined\n"},
         {"d[0 +: 0]", Value, L + "Width operand in indexed part-select of name 'd' must be > 0\n"},
         {"d[0 +: 9]", Value, L + "Width operand in indexed part-select of name 'd' is out of range\n"},
+        {"d[6 +: 3]", Value, L + "Width operand in indexed part-select of name 'd' is out of range\n"},
+        {"a[1 -: 3]", Value, L + "Width operand in indexed part-select of name 'a' is out of range\n"},
+        {"d[i +: 8]", Value, ""},
+        {"d[i +: 9]", Value, L + "Width operand in indexed part-select of name 'd' is out of range\n"},
         {"x[0 +: 1]", Value, L + "Indexed part-select of name 'x' is illegal\n"},
     });
     EXPECT_EQ(b.expr("d[0]")->isA(BitSelect), true);
