@@ -12,8 +12,8 @@ Tn_VerilogValuePtr Tn_VerilogRealConst::constantValue() const { return Tn_Verilo
 
 Tn_VerilogTypePtr Tn_VerilogConstant::typeAs(Tn_VerilogElabContext& ctx, Tn_Verilog::ValueType) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    Tn_VerilogValuePtr v = constantValue();
-    return v->isReal() ? Tn_VerilogType::createReal() : Tn_VerilogType::createScalar(v->isSigned());
+    const Shape s = shape();
+    return s.isReal ? Tn_VerilogType::createReal() : Tn_VerilogType::createScalar(s.isSigned);
 }
 
 Tn_VerilogValuePtr Tn_VerilogConstant::evaluate(const Tn_VerilogEvalContext& ctx) const {
@@ -21,16 +21,26 @@ Tn_VerilogValuePtr Tn_VerilogConstant::evaluate(const Tn_VerilogEvalContext& ctx
 }
 
 uint32_t Tn_VerilogConstant::contextWidth(uint32_t width) const {
-    uint32_t own = constantValue()->width();
+    const uint32_t own = shape().width;
     return own > width ? own : width;
 }
 
-bool Tn_VerilogConstant::isReal() const { return constantValue()->isReal(); }
+bool Tn_VerilogConstant::isReal() const { return shape().isReal; }
 
-bool Tn_VerilogConstant::isSigned(bool contextSigned) const {
-    return contextSigned && constantValue()->isSigned();
-}
+bool Tn_VerilogConstant::isSigned(bool contextSigned) const { return contextSigned && shape().isSigned; }
 
 Port_String Tn_VerilogConstant::describe() const { return constantValue()->describe(); }
 
-bool Tn_VerilogConstant::bounds(int32_t& msb, int32_t& lsb) const { return boundsOf(constantValue(), msb, lsb); }
+bool Tn_VerilogConstant::bounds(int32_t& msb, int32_t& lsb) const {
+    const Shape s = shape();
+    if (s.isReal) return false;
+    msb = static_cast<int32_t>(s.width) - 1;
+    lsb = 0;
+    return true;
+}
+
+bool Tn_VerilogVectorConst::bounds(int32_t& msb, int32_t& lsb) const {
+    msb = Value.msb();
+    lsb = Value.lsb();
+    return true;
+}

@@ -384,6 +384,12 @@ public:
 #define TN_HAS_MEMBERS_Constant TN_PROBE
 #define TN_MEMBERS_Constant                                                                           \
     virtual Tn_VerilogValuePtr constantValue() const;                                                 \
+    /* Width, sign and realness, known without making the value. */                                  \
+    struct Shape {                                                                                    \
+        uint32_t width;                                                                               \
+        bool isSigned, isReal;                                                                        \
+    };                                                                                                \
+    virtual Shape shape() const { return Shape{32, true, false}; }                                   \
     Tn_VerilogTypePtr typeAs(Tn_VerilogElabContext& ctx, Tn_Verilog::ValueType use) override;         \
     Tn_VerilogValuePtr evaluate(const Tn_VerilogEvalContext& ctx) const override;                     \
     uint32_t contextWidth(uint32_t width) const override;                                             \
@@ -397,9 +403,14 @@ public:
 #define TN_HAS_MEMBERS_IntegerConst TN_PROBE
 #define TN_MEMBERS_IntegerConst Tn_VerilogValuePtr constantValue() const override;
 #define TN_HAS_MEMBERS_VectorConst TN_PROBE
-#define TN_MEMBERS_VectorConst Tn_VerilogValuePtr constantValue() const override;
+#define TN_MEMBERS_VectorConst                                                                        \
+    Tn_VerilogValuePtr constantValue() const override;                                                \
+    Shape shape() const override { return Shape{Value.width(), Value.isSigned(), false}; }           \
+    bool bounds(int32_t& msb, int32_t& lsb) const override;
 #define TN_HAS_MEMBERS_RealConst TN_PROBE
-#define TN_MEMBERS_RealConst Tn_VerilogValuePtr constantValue() const override;
+#define TN_MEMBERS_RealConst                                                                          \
+    Tn_VerilogValuePtr constantValue() const override;                                                \
+    Shape shape() const override { return Shape{64, true, true}; }
 
 // Names: resolution and the properties of what they denote.
 #define TN_HAS_MEMBERS_Name TN_PROBE
