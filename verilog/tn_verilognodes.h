@@ -7,6 +7,7 @@
 #include "verilog/tn_verilognode.h"
 #include "verilog/tn_verilognodedef.h"
 #include "verilog/tn_verilognodefactory.h"
+#include "verilog/tn_verilognodemembers.h"
 #include "verilog/tn_verilogvector.h"
 #include "verilog/tn_verilogvisitor.h"
 
