@@ -18,6 +18,7 @@ const Command kCommands[] = {
     {"parse", "parse the sources into binary libraries, checking each unit", tarnParse},
     {"elaborate", "elaborate units stored in binary libraries", tarnElaborate},
     {"data", "read only modules, ports, parameters and instances", tarnData},
+    {"eval", "evaluate constant expressions as Tarn does", tarnEval},
     {"tokens", "preprocess and scan the sources, print every token (-count: only count)", tarnTokens},
 };
 

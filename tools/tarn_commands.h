@@ -13,6 +13,7 @@ int tarnCompile(const TarnArgs& args);
 int tarnParse(const TarnArgs& args);
 int tarnElaborate(const TarnArgs& args);
 int tarnData(const TarnArgs& args);
+int tarnEval(const TarnArgs& args);
 int tarnTokens(const TarnArgs& args);
 
 #endif
