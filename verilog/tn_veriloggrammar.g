@@ -1006,8 +1006,10 @@ binaryExpression returns [Tn_VerilogExpression* e = 0]
       ( { binaryOperand(e); op = tok(); }
         ( LOGICAL_OR | LOGICAL_AND | BIT_OR | CARET | XNOR | AMPERSAND
         | EQUAL | NOT_EQUAL | CASE_EQUAL | CASE_NOT_EQUAL
-        | LESS_THAN | LE | GT | GE | SHIFT_LEFT | SHIFT_RIGHT | ASHIFT_LEFT | ASHIFT_RIGHT
-        | PLUS | MINUS | STAR | DIV | MOD | POWER
+        | LESS_THAN | LE | GT | GE | SHIFT_LEFT | SHIFT_RIGHT
+        | PLUS | MINUS | STAR | DIV | MOD
+        // Arithmetic shifts and the power operator are Verilog-2001.
+        | { v2001() }? ( ASHIFT_LEFT | ASHIFT_RIGHT | POWER )
         )
         a=attributeInstances { binaryOperator(op, a); }
         e=unaryExpression
@@ -1090,8 +1092,8 @@ number returns [Tn_VerilogExpression* e = 0]
 
 basedNumber[Tn_VerilogTok size] returns [Tn_VerilogExpression* e = 0]
 { Tn_VerilogTok d, bn, o, h; Tn_VerilogTok b = tok(); }
-    : ( BASE_D | BASE_SD ) { d = tok(); } DECIMAL_NUMBER { e = basedConstant(size, b, d); }
-    | ( BASE_B | BASE_SB ) { bn = tok(); } BINARY_NUMBER { e = basedConstant(size, b, bn); }
-    | ( BASE_O | BASE_SO ) { o = tok(); } OCTAL_NUMBER { e = basedConstant(size, b, o); }
-    | ( BASE_H | BASE_SH ) { h = tok(); } HEX_NUMBER { e = basedConstant(size, b, h); }
+    : ( BASE_D | { v2001() }? BASE_SD ) { d = tok(); } DECIMAL_NUMBER { e = basedConstant(size, b, d); }
+    | ( BASE_B | { v2001() }? BASE_SB ) { bn = tok(); } BINARY_NUMBER { e = basedConstant(size, b, bn); }
+    | ( BASE_O | { v2001() }? BASE_SO ) { o = tok(); } OCTAL_NUMBER { e = basedConstant(size, b, o); }
+    | ( BASE_H | { v2001() }? BASE_SH ) { h = tok(); } HEX_NUMBER { e = basedConstant(size, b, h); }
     ;

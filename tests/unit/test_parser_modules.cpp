@@ -515,6 +515,14 @@ TEST_F(ParserModules, Verilog1995ModeRejectsVerilog2001Syntax) {
     EXPECT_EQ(errors().size(), 1u);
     result = parse("module m; wire [7:0] w; wire x = w[0 +: 2]; endmodule\n", {"-1995"});
     EXPECT_EQ(errors().size(), 1u);
+    // Operators and signed constants that Verilog-1995 does not have.
+    for (const char* e : {"w ** 2", "w <<< 1", "w >>> 1", "4'sd3", "4'Sh3", "4'sb1"}) {
+        const std::string text = std::string("module m; wire [7:0] w; wire [7:0] x = ") + e + "; endmodule\n";
+        result = parse(text, {"-1995"});
+        EXPECT_EQ(errors().size(), 1u) << e;
+        result = parse(text);
+        EXPECT_EQ(errors(), Texts{}) << e;
+    }
     // In Verilog-1995 mode generate is a name like any other.
     result = parse("module m; wire generate; endmodule\n", {"-1995"});
     EXPECT_EQ(errors(), Texts{});
