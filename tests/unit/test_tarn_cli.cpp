@@ -60,3 +60,34 @@ TEST(TarnCli, ElaborateNeedsTopUnits) {
     EXPECT_EQ(r.status, 1);
     EXPECT_EQ(r.err, "Error: No top level design units found for elaboration\ntarn: 1 error, 0 warnings\n");
 }
+
+TEST(TarnCli, EvalPrintsOneLinePerExpression) {
+    CommandResult r = runTarn("eval \"8'sd3 + 4'd1\" \"-8'sd1\" \"1'bx ? 4'b1100 : 4'b1010\" \"2.0 ** 0.5\" "
+                              "'$time' \"{2{3'b1z0}}\" +define+W=4 '`W'\\''d9 << 1'");
+    EXPECT_EQ(r.status, 0) << r.err;
+    EXPECT_EQ(r.out,
+              "8 u 00000100 4\n"
+              "8 s 11111111 -1\n"
+              "4 u 1xx0 X\n"
+              "real 1.4142135623730951\n"
+              "null\n"
+              "6 u 1z01z0 Z\n"
+              "4 u 0010 2\n");
+    EXPECT_EQ(r.err, "tarn: 0 errors, 0 warnings\n");
+}
+
+TEST(TarnCli, EvalErrorsGiveNullAndStatusOne) {
+    CommandResult r = runTarn("eval \"1 +\" \"3'd5\" \"a + 1\"");
+    EXPECT_EQ(r.status, 1);
+    EXPECT_EQ(r.out, "null\n3 u 101 5\nnull\n");
+    EXPECT_NE(r.err.find("Error: Syntax error in expression '1 +': "), std::string::npos) << r.err;
+    EXPECT_NE(r.err.find("Name 'a' could not be resolved"), std::string::npos) << r.err;
+    EXPECT_NE(r.err.find("tarn: 2 errors, 0 warnings\n"), std::string::npos) << r.err;
+    // Verilog-1995 has no power operator.
+    r = runTarn("eval -95 \"2 ** 3\"");
+    EXPECT_EQ(r.status, 1);
+    EXPECT_EQ(r.out, "null\n");
+    r = runTarn("eval");
+    EXPECT_EQ(r.status, 2);
+    EXPECT_NE(r.err.find("Usage: tarn eval"), std::string::npos);
+}
