@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 
 #include <set>
-#include <sstream>
 
 #include "tests/support/parse.h"
 #include "tests/support/parsercorpus.h"
@@ -90,6 +89,25 @@ struct Modules : ParseTest {
     }
     // The source side of the module's continuous assignment number i.
     Tn_VerilogExpression* assigned(Tn_VerilogModule* m, size_t i) { return m->ContAssign[i]->Source; }
+    // Parses a clean compilation and checks each module that needs no
+    // elaboration: its constant functions run with the procedural code,
+    // later. Returns how many modules were checked.
+    int checkCompilation(const std::vector<std::string>& args, const std::string& name) {
+        sink.clear();
+        result = parseArgs(args);
+        EXPECT_EQ(sink.errors(), Texts{}) << name;
+        int checked = 0;
+        for (const Port_String& unit : result.compiled) {
+            Tn_VerilogModule* m = result.module(unit.c_str());
+            if (!m || !m->ConstFuncCall.empty()) continue;
+            Tn_VerilogElabContext& ctx = context(m, unit.c_str());
+            ctx.popScope();
+            CheckAll(ctx).scope(m);
+            ++checked;
+        }
+        EXPECT_EQ(unexpectedErrors(), Texts{}) << name;
+        return checked;
+    }
 };
 
 }  // namespace
@@ -229,67 +247,28 @@ TEST_F(Modules, PortRedeclarations) {
 }
 
 TEST_F(Modules, CleanSourcesCheckWithoutMessages) {
-    // Compilations of the parser corpus that need no elaboration to resolve
-    // their names (no hierarchical references into other modules).
+    // Compilations of the parser corpus (each row names a fault of one
+    // compilation; its files are the clean ones).
     int checked = 0;
     std::set<std::string> compilations;
     for (const CorpusCase& c : readParserCorpus()) {
-        // Each row names a fault of a compilation; its files are the clean ones.
         if (!compilations.insert(c.name.substr(0, c.name.find('/'))).second) continue;
         std::vector<std::string> args;
         for (const std::string& f : c.files) args.push_back(parserCorpusDir() + "/" + f);
         for (const std::string& d : c.includeDirs) args.push_back("+incdir+" + parserCorpusDir() + "/" + d);
         for (const std::string& d : c.defines) args.push_back("+define+" + d);
         if (c.mode == "1995") args.push_back("-95");
-        sink.clear();
-        result = parseArgs(args);
-        if (!sink.errors().empty()) continue;
-        for (const Port_String& name : result.compiled) {
-            Tn_VerilogModule* m = result.module(name.c_str());
-            // Constant functions are run by the procedural code, later.
-            if (!m || !m->ConstFuncCall.empty()) continue;
-            Tn_VerilogElabContext& ctx = context(m, name.c_str());
-            ctx.popScope();
-            CheckAll all(ctx);
-            all.scope(m);
-            ++checked;
-        }
-        EXPECT_EQ(unexpectedErrors(), Texts{}) << c.name;
+        checked += checkCompilation(args, c.name);
     }
     EXPECT_GT(checked, 40);
 }
 
 // The designs of the shared corpus (real open-source cores), when present.
 TEST_F(Modules, SharedCorpusDesignsCheckWithoutMessages) {
-    const std::string dir = std::string(TARN_SHARED_DIR) + "/corpus/designs";
-    std::istringstream manifest(readFile(dir + "/MANIFEST.tsv"));
-    if (!manifest.str().size()) GTEST_SKIP() << "no shared corpus at " << dir;
-    std::string line;
-    std::getline(manifest, line);
+    std::vector<SharedDesign> designs;
+    if (!readSharedDesigns(designs)) GTEST_SKIP() << "the shared design corpus is not at " << sharedCorpusDir();
     int checked = 0;
-    while (std::getline(manifest, line)) {
-        std::vector<std::string> f;
-        std::istringstream row(line);
-        for (std::string x; std::getline(row, x, '\t');) f.push_back(x);
-        if (f.size() < 8) continue;
-        std::vector<std::string> args;
-        std::istringstream files(f[5]), incs(f[6]), defs(f[7]);
-        for (std::string x; files >> x;) args.push_back(dir + "/" + f[0] + "/" + x);
-        for (std::string x; incs >> x;) args.push_back("+incdir+" + dir + "/" + f[0] + "/" + x);
-        for (std::string x; defs >> x;) args.push_back("+define+" + x);
-        sink.clear();
-        result = parseArgs(args);
-        if (!sink.errors().empty()) continue;
-        for (const Port_String& name : result.compiled) {
-            Tn_VerilogModule* m = result.module(name.c_str());
-            if (!m || !m->ConstFuncCall.empty()) continue;
-            Tn_VerilogElabContext& ctx = context(m, name.c_str());
-            ctx.popScope();
-            CheckAll all(ctx);
-            all.scope(m);
-            ++checked;
-        }
-        for (const std::string& e : unexpectedErrors()) ADD_FAILURE() << f[0] << ": " << e;
-    }
+    for (const SharedDesign& d : designs) checked += checkCompilation(d.args, d.name);
+    EXPECT_GT(checked, 0);
     std::cout << "[          ] " << checked << " modules checked\n";
 }
