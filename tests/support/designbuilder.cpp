@@ -2,7 +2,8 @@
 
 #include <stdexcept>
 
-#include "tests/support/exprparser.h"
+#include "verilog/tn_verilogfields.h"
+#include "verilog/tn_verilogparser.h"
 
 namespace {
 
@@ -169,14 +170,60 @@ Tn_VerilogIODeclaration* DesignBuilder::port(Tn_VerilogRegion* scope, Tn_Verilog
     return io;
 }
 
+namespace {
+
+// Puts the parsed nodes in the builder's file. The parser reads a select
+// of a name it has not seen declared as a bit select; of a name the builder
+// declared as an array, the first selects index its words.
+class WordSelects : public Tn_VerilogChildVisitor {
+public:
+    WordSelects(Tn_VerilogNodeFactory& f, const std::map<std::string, int>& arrays, const Tn_Location& l)
+        : f_(f), arrays_(arrays), location_(l) {}
+
+    void eachChild(const Tn_FieldInfo&, Tn_VerilogNode*& child) override { rewrite(child); }
+
+    void rewrite(Tn_VerilogNode*& n) {
+        if (!n) return;
+        n->setLocation(location_);
+        n->visitFields(*this);
+        Tn_VerilogBitSelect* b = Tn_VerilogNode::cast<Tn_VerilogBitSelect>(n);
+        if (!b) return;
+        if (Tn_VerilogSimpleName* name = Tn_VerilogNode::cast<Tn_VerilogSimpleName>(b->Operand.get())) {
+            if (dimensions(name) == 0) return;
+            Tn_VerilogWordSelect* w = f_.createWordSelect(location_);
+            w->Operand = name;
+            w->Index.push_back(b->Index);
+            n = w;
+        } else if (Tn_VerilogWordSelect* w = Tn_VerilogNode::cast<Tn_VerilogWordSelect>(b->Operand.get())) {
+            Tn_VerilogSimpleName* name = Tn_VerilogNode::cast<Tn_VerilogSimpleName>(w->Operand.get());
+            if (!name || w->Index.size() >= dimensions(name)) return;
+            w->Index.push_back(b->Index);
+            n = w;
+        }
+    }
+
+private:
+    size_t dimensions(Tn_VerilogSimpleName* n) const {
+        auto it = arrays_.find(n->Name.str().str());
+        return it == arrays_.end() ? 0 : static_cast<size_t>(it->second);
+    }
+
+    Tn_VerilogNodeFactory& f_;
+    const std::map<std::string, int>& arrays_;
+    Tn_Location location_;
+};
+
+}  // namespace
+
 Tn_VerilogExpression* DesignBuilder::expr(const std::string& text) {
-    TestExprParser parser(factory(), location_, [this](const std::string& name) {
-        auto it = arrays_.find(name);
-        return it == arrays_.end() ? 0 : it->second;
-    });
-    Tn_VerilogExpression* e = parser.parse(text);
-    if (!e) throw std::invalid_argument("test expression '" + text + "': " + parser.error());
-    return e;
+    Tn_VerilogNode* e = nullptr;
+    try {
+        e = Tn_VerilogParser::parseExpression(text.c_str(), factory(), options_);
+    } catch (const Tn_VerilogExpressionSyntaxError& x) {
+        throw std::invalid_argument("test expression '" + text + "': " + x.message().c_str());
+    }
+    WordSelects(factory(), arrays_, location_).rewrite(e);
+    return static_cast<Tn_VerilogExpression*>(e);
 }
 
 Tn_VerilogElabContext& DesignBuilder::context(Tn_VerilogScope* scope) {
