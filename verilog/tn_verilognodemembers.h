@@ -31,6 +31,16 @@ class Tn_VerilogTask;
 // (specparams) and system function calls may not appear.
 enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
 
+// The properties of a type definition, which a declaration answers for its
+// own (1, unsigned, ... unless a class says otherwise).
+#define TN_TYPE_PROPERTIES                                                                            \
+    virtual uint32_t width() const { return 1; }                                                      \
+    virtual bool isSigned() const { return false; }                                                   \
+    virtual bool isReal() const { return false; }                                                     \
+    virtual bool hasFixedSize() const { return true; }                                                \
+    virtual bool isNet() const { return false; }                                                      \
+    virtual bool isVariable() const { return false; }
+
 // ---------------------------------------------------------------- attributed
 
 #define TN_HAS_MEMBERS_AttributedNode TN_PROBE
@@ -59,12 +69,7 @@ enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
     /* Constant value (declared bounds kept); null when not a constant or not computable. */        \
     virtual Tn_VerilogValuePtr value() const;                                                         \
     /* Properties of the type definition (1, unsigned, ... for others). */                           \
-    virtual uint32_t width() const { return 1; }                                                      \
-    virtual bool isSigned() const { return false; }                                                   \
-    virtual bool isReal() const { return false; }                                                     \
-    virtual bool hasFixedSize() const { return true; }                                                \
-    virtual bool isNet() const { return false; }                                                      \
-    virtual bool isVariable() const { return false; }                                                 \
+    TN_TYPE_PROPERTIES                                                                                \
     /* Whether a plain reference may be assigned as a net / a variable. */                           \
     virtual bool isNetLValue() const { return false; }                                                \
     virtual bool isVarLValue() const { return false; }                                                \
@@ -587,12 +592,7 @@ public:
 #define TN_MEMBERS_TypeDef                                                                            \
     /* Checks the range and delay; void, or the error type after a message. */                       \
     virtual Tn_VerilogTypePtr check(Tn_VerilogElabContext& ctx);                                      \
-    virtual uint32_t width() const { return 1; }                                                      \
-    virtual bool isSigned() const { return false; }                                                   \
-    virtual bool isReal() const { return false; }                                                     \
-    virtual bool hasFixedSize() const { return true; }                                                \
-    virtual bool isNet() const { return false; }                                                      \
-    virtual bool isVariable() const { return false; }                                                 \
+    TN_TYPE_PROPERTIES                                                                                \
     /* "wire", "vector reg", "integer variable", "event". */                                         \
     virtual Port_String describe() const { return Port_String(); }                                    \
     virtual Tn_VerilogTypePtr type() const { return Tn_VerilogType::createUnknown(); }                                                       \
