@@ -1,3 +1,5 @@
+#include <algorithm>
+
 #include "util/tn_message.h"
 #include "verilog/tn_verilogelabcontext.h"
 #include "verilog/tn_verilognodes.h"
@@ -15,6 +17,19 @@ Group groupOf(int32_t op) {
     if (op == LogicalOr || op == LogicalAnd || (op >= Equal && op <= GreaterEqual)) return Comparison;
     if ((op >= LeftShift && op <= ArithRightShift) || op == Exponentiation) return LeftOperand;
     return Arithmetic;
+}
+
+// A power of a wide base costs one or two wide products per exponent bit
+// (fewer for even bases, which reach 0, and odd ones, which reach 1). Beyond
+// this many limb products there is no value, as for values wider than
+// kMaxWidth, so that no constant stalls evaluation.
+bool tooCostlyPower(uint32_t width, const Tn_VerilogValuePtr& exponent) {
+    if (width <= 64 || !exponent || exponent->isNull() || exponent->isReal() || exponent->hasUnknown()) return false;
+    const Tn_VerilogVector e = exponent->toVector();
+    uint32_t bits = e.width();
+    while (bits > 0 && e.bit(bits - 1) == 0) --bits;
+    const double limbs = (width + 31) / 32;
+    return limbs * limbs * 2.0 * std::min(bits, width) > 4.0e9;
 }
 
 // Operators whose operands may be real.
@@ -76,7 +91,9 @@ Tn_VerilogValuePtr Tn_VerilogBinaryOp::evaluate(const Tn_VerilogEvalContext& ctx
     case LeftOperand: {
         const Tn_VerilogEvalContext inner = operandContext(ctx);
         if (inner.tooWide()) return Tn_VerilogValue::createNull();
-        return op(LOperand->evaluate(inner), ROperand->evaluate(self), inner);
+        const Tn_VerilogValuePtr l = LOperand->evaluate(inner), r = ROperand->evaluate(self);
+        if (OpType == Exponentiation && !isReal() && tooCostlyPower(inner.width, r)) return Tn_VerilogValue::createNull();
+        return op(l, r, inner);
     }
     default: {
         const Tn_VerilogEvalContext inner = operandContext(ctx);

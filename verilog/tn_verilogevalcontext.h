@@ -33,8 +33,10 @@ struct Tn_VerilogEvalContext {
     }
 
     // Constant evaluation stops (the value is null) where a context or a
-    // result would be wider than this: 16M bits, 2 MB a vector.
-    static const uint32_t kMaxWidth = 1u << 24;
+    // result would be wider than this: 1M bits, the widest literal the
+    // parser takes. Products, quotients and decimal texts cost the square of
+    // the width; at this bound each still takes well under a second.
+    static const uint32_t kMaxWidth = 1u << 20;
     bool tooWide() const { return width > kMaxWidth; }
 
     // Self-determined, without messages.

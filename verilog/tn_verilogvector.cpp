@@ -530,6 +530,11 @@ public:
                 std::memcpy(running.data(), tmp.data(), n * sizeof(uint32_t));
                 result[n - 1] &= Word::maskOf(topBits(w));
                 running[n - 1] &= Word::maskOf(topBits(w));
+                // An odd base reaches 1 within w squarings: the rest multiply by 1.
+                if (running[0] == 1 && significant(running.data(), n) == 1) {
+                    i = expTop;
+                    break;
+                }
             }
         }
         result[n - 1] &= Word::maskOf(topBits(w));

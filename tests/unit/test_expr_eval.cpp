@@ -56,6 +56,17 @@ TEST_F(Eval, ShiftsAndPowersFollowTheirLeftOperand) {
     EXPECT_EQ(eval("8'sd2 ** -8'sd1"), "8 s xxxxxxxx x");
 }
 
+TEST_F(Eval, WidePowersOfLongExponentsStopEarlyOrHaveNoValue) {
+    // An odd base reaches 1 and an even one 0 long before a 128-bit exponent
+    // runs out (3 ** (2**128 - 1) mod 2**128 as Python's pow computes it).
+    EXPECT_EQ(eval("(128'd3 ** {4{32'hffffffff}}) == 128'd226854911280625642308916404954512140971"), "1 u 1 1");
+    EXPECT_EQ(eval("(128'd6 ** 200) == 0"), "1 u 1 1");
+    EXPECT_EQ(eval("(100'd7 ** 3) == 343"), "1 u 1 1");
+    // Wide products for every bit of a wide exponent would take hours.
+    EXPECT_EQ(eval("65536'd3 ** {2048{32'hffffffff}}"), "null");
+    EXPECT_EQ(checked("(65536'd3 ** 20) == 65536'd3486784401")->value()->toBool(), true);
+}
+
 TEST_F(Eval, ComparisonsSizeTheirOperandsToEachOther) {
     // In a 16-bit context a == b is 16 bits wide, but it compares in its own
     // operands' width and then widens a one-bit result.
@@ -93,9 +104,10 @@ TEST_F(Eval, ConcatenationAndReplication) {
     EXPECT_EQ(eval("{0{1'b1}}"), "null");
     EXPECT_EQ(eval("{(-1){1'b1}}"), "null");
     EXPECT_EQ(eval("{1'bx{1'b1}}"), "null");
-    // Counts are built by doubling; beyond 16M bits there is no value.
+    // Counts are built by doubling; beyond 1M bits there is no value.
     EXPECT_EQ(text(checked("{1000{8'h5a}}")->value()).substr(0, 14), "8000 u 0101101");
-    EXPECT_EQ(eval("{20000000{1'b1}}"), "null");
+    EXPECT_EQ(eval("{1048577{1'b1}}"), "null");
+    EXPECT_EQ(checked("{1048576{1'b1}}")->value()->width(), 1048576u);
     EXPECT_EQ(eval("{32'hffffffff{1'b1}}"), "null");
 }
 
