@@ -206,6 +206,7 @@ void Tn_VerilogFlexLexer::start() {
     state_.sourceFiles.clear();
     state_.nextSource = 0;
     state_.bytesRead = 0;
+    state_.expandedBytes = 0;
     state_.text.clear();
     state_.file = Tn_RCStringPtr();
     state_.line = 0;
@@ -699,6 +700,10 @@ void Tn_VerilogFlexLexer::macroReference(const Port_String& name, const Port_Str
     }
     if (state_.openExpansions >= kMaxExpansionDepth || state_.openExpansionBytes + text.size() > kMaxExpansionBytes)
         raise("Recursive expansion of macro `%s", name.c_str());
+    state_.expandedBytes += text.size();
+    if (state_.expandedBytes > std::max(kMinTotalExpansionBytes, kExpansionRatio * state_.bytesRead))
+        raise("Macro expansions exceed their limit at `%s (%zu bytes expanded from %zu bytes of source)", name.c_str(),
+              state_.expandedBytes, state_.bytesRead);
     const int size = static_cast<int>(text.size()) + 2;
     Tn_VerilogScannerState::Input* in =
         new Tn_VerilogScannerState::Input(Tn_VerilogScannerState::Input::MACRO, name, std::move(text));

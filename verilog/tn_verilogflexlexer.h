@@ -32,9 +32,12 @@ public:
     };
     // Bounds that turn runaway input into a scanner error instead of a hang:
     // nested macro expansions (a macro that expands to itself), the text they
-    // hold, and nested include files.
+    // hold, all expansion text of a compilation (macros that double at each
+    // level: 40 lines can ask for 2^40 tokens), and nested include files.
     static constexpr int kMaxExpansionDepth = 1000;
     static constexpr size_t kMaxExpansionBytes = size_t(16) << 20;
+    static constexpr size_t kMinTotalExpansionBytes = size_t(32) << 20;
+    static constexpr size_t kExpansionRatio = 16;  // times the bytes read from files
     static constexpr int kMaxIncludeDepth = 200;
 
     Tn_VerilogFlexLexer(const Tn_VerilogOptions& options, Tn_VerilogDirectiveState& directives);

@@ -117,6 +117,8 @@ public:
     bool announceLibrary = false;
     // Bytes read from files (the throughput of the scanner is measured on them).
     size_t bytesRead = 0;
+    // Bytes of macro expansion text made so far, nested or not.
+    size_t expandedBytes = 0;
 
 private:
     const Tn_VerilogOptions* options_;

@@ -122,6 +122,14 @@ TEST_F(Macros, RunawayExpansionsStopWithAnError) {
     EXPECT_EQ(r.errorLine, 4);
     // Each expansion doubles its argument: stopped by the size bound long before memory runs out.
     EXPECT_EQ(scanFailing("`define G(x) `G(x x)\n`G(y)").error, "Recursive expansion of macro `G");
+    // Macros that double at each level, none recursive: 2^40 tokens asked
+    // for by 42 lines. All expansion text of a compilation is bounded.
+    std::string doubling = "`define A0 abcdefghijklmnopqrstuvwxyz0123456789\n";
+    for (int i = 1; i <= 40; ++i)
+        doubling += "`define A" + std::to_string(i) + " `A" + std::to_string(i - 1) + " `A" + std::to_string(i - 1) + "\n";
+    r = scanFailing(doubling + "`A40\n");
+    EXPECT_EQ(r.error.rfind("Macro expansions exceed their limit at `A", 0), 0u) << r.error;
+    EXPECT_EQ(r.errorLine, 42);
     EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(20));
     // Deep but finite nesting is fine.
     std::string chain;
