@@ -207,6 +207,7 @@ void Tn_VerilogFlexLexer::start() {
     state_.nextSource = 0;
     state_.bytesRead = 0;
     state_.expandedBytes = 0;
+    state_.includesOpened = 0;
     state_.text.clear();
     state_.file = Tn_RCStringPtr();
     state_.line = 0;
@@ -549,6 +550,8 @@ void Tn_VerilogFlexLexer::include() {
     }
     if (depth > kMaxIncludeDepth)
         raise("Verilog include files nested more than %d deep at '%s'", kMaxIncludeDepth, path.c_str());
+    if (++state_.includesOpened > state_.includeLimit)
+        raise("More than %zu include files opened at '%s'", state_.includeLimit, path.c_str());
 
     state_.fileList.addInclude(path, state_.currentFilePath());
     TN_MSG().issueStatus("Compiling verilog include file \"%s\"\n", path.c_str());

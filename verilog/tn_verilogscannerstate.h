@@ -119,6 +119,12 @@ public:
     size_t bytesRead = 0;
     // Bytes of macro expansion text made so far, nested or not.
     size_t expandedBytes = 0;
+    // Include files opened so far, and how many a compilation may open:
+    // files that each include the next one twice open exponentially many
+    // without any being recursive (about 20 s at the default bound).
+    size_t includesOpened = 0;
+    static constexpr size_t kMaxIncludes = 1000000;
+    size_t includeLimit = kMaxIncludes;
 
 private:
     const Tn_VerilogOptions* options_;

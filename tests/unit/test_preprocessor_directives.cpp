@@ -210,6 +210,29 @@ TEST_F(Directives, RecursiveIncludesAreScannerErrors) {
     EXPECT_EQ(text("`include \"g.vh\"\n`include \"g.vh\"\n", {inc}), "g");
 }
 
+TEST_F(Directives, IncludeFilesOpenedInACompilationAreBounded) {
+    // Each file includes the next one twice: 2^10 - 1 openings from 10
+    // files, none recursive; real bounds are far higher, the test lowers it.
+    for (int i = 0; i < 9; ++i) {
+        const std::string next = "`include \"b" + std::to_string(i + 1) + ".vh\"\n";
+        dir.write("b" + std::to_string(i) + ".vh", next + next);
+    }
+    dir.write("b9.vh", "x\n");
+    auto scan = [&](size_t limit) {
+        driver.reset(new Tn_VerilogCompiler());
+        EXPECT_TRUE(driver->scanSources({"tarn", Port_String(dir.write("t.v", "`include \"b0.vh\"\n")),
+                                         Port_String("+incdir+" + dir.path())}));
+        driver->lexer().state().includeLimit = limit;
+        return drainTokens(driver->lexer());
+    };
+    ScanResult r = scan(1023);
+    EXPECT_FALSE(r.failed) << r.error;
+    EXPECT_EQ(r.tokens.size(), 512u + 1);  // 512 x and the end
+    r = scan(1022);
+    EXPECT_EQ(r.error, "More than 1022 include files opened at '" + dir.path() + "/b9.vh'");
+    EXPECT_EQ(Tn_VerilogScannerState::kMaxIncludes, 1000000u);
+}
+
 TEST_F(Directives, IncludeNestingIsBounded) {
     const int depth = Tn_VerilogFlexLexer::kMaxIncludeDepth;
     for (int i = 0; i <= depth; ++i)
