@@ -19,18 +19,6 @@ bool isOption(const Port_String& a) {
     return a == "-95" || a == "-2001" || std::strncmp(a.c_str(), "+define+", 8) == 0;
 }
 
-// "<width> <s|u> <binary> <decimal>", "real <%.17g>" or "null".
-void print(const Tn_VerilogValuePtr& v) {
-    if (!v || v->isNull()) {
-        std::printf("null\n");
-    } else if (v->isReal()) {
-        std::printf("real %.17g\n", v->toReal());
-    } else {
-        std::printf("%u %s %s %s\n", v->width(), v->isSigned() ? "s" : "u", v->toBinaryText().c_str(),
-                    v->toDecimalText().c_str());
-    }
-}
-
 }  // namespace
 
 int tarnEval(const TarnArgs& args) {
@@ -60,7 +48,7 @@ int tarnEval(const TarnArgs& args) {
             TN_MSG().issueError("Syntax error in expression '%s': %s\n", text.c_str(), x.message().c_str());
         }
         const bool ok = e && !e->typeAs(ctx, Tn_Verilog::Value)->isError();
-        print(ok ? e->value() : Tn_VerilogValuePtr());
+        std::printf("%s\n", Tn_VerilogValue::evalText(ok ? e->value() : Tn_VerilogValuePtr()).c_str());
     }
     return 0;
 }

@@ -217,6 +217,13 @@ const U kReductionNor = {U::RealNull, nullptr, &Vec::reduceNor};
 
 }  // namespace
 
+Port_String Tn_VerilogValue::evalText(const Tn_VerilogValuePtr& v) {
+    if (!v || v->isNull()) return "null";
+    if (v->isReal()) return Port_String::doFormat("real %.17g", v->toReal());
+    return Port_String::doFormat("%u %s %s %s", v->width(), v->isSigned() ? "s" : "u", v->toBinaryText().c_str(),
+                                 v->toDecimalText().c_str());
+}
+
 Tn_VerilogValuePtr Tn_VerilogValue::fit(const Tn_VerilogValuePtr& v, const Tn_VerilogEvalContext& ctx) {
     if (!v || v->isNull() || v->isReal()) return v;
     bool s = targetSigned(v->isSigned(), ctx);

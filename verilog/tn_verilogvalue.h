@@ -53,6 +53,10 @@ public:
     static Tn_VerilogValuePtr createVector(const Tn_VerilogVector& value);
     static Tn_VerilogValuePtr createVector(Tn_VerilogVector&& value);
 
+    // What `tarn eval` prints for a value: "<width> <s|u> <binary> <decimal>",
+    // "real <%.17g>", or "null" (no value, or a null one).
+    static Port_String evalText(const Tn_VerilogValuePtr& v);
+
     // The value fitted to the context: never narrowed; widened and re-signed
     // (signed only when both are) when it differs. Null and real unchanged.
     static Tn_VerilogValuePtr fit(const Tn_VerilogValuePtr& v, const Tn_VerilogEvalContext& ctx);

@@ -1,13 +1,5 @@
 #include "tests/support/checkfixture.h"
 
-std::string valueText(const Tn_VerilogValuePtr& v) {
-    if (!v || v->isNull()) return "null";
-    if (v->isReal()) return Port_String::doFormat("real %.17g", v->toReal()).str();
-    return Port_String::doFormat("%u %s %s %s", v->width(), v->isSigned() ? "s" : "u", v->toBinaryText().c_str(),
-                                 v->toDecimalText().c_str())
-        .str();
-}
-
 Texts CheckFixture::errorsOf(const std::string& e, Tn_VerilogScope* scope, Tn_Verilog::ValueType use) {
     sink.clear();
     checked = b.expr(e)->typeAs(b.context(scope ? scope : m), use);

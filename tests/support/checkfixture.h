@@ -1,6 +1,5 @@
 // What checking tests share: a module m to declare in, the messages captured,
-// the errors of checking one expression, tables of expected messages, and
-// values as `tarn eval` prints them.
+// the errors of checking one expression, and tables of expected messages.
 #ifndef TARN_TESTS_CHECKFIXTURE_H
 #define TARN_TESTS_CHECKFIXTURE_H
 
@@ -13,9 +12,6 @@
 #include "tests/support/designbuilder.h"
 
 typedef std::vector<std::string> Texts;
-
-// "<width> <s|u> <binary> <decimal>", "real <%.17g>" or "null".
-std::string valueText(const Tn_VerilogValuePtr& v);
 
 // One expression, the use it is checked for, and the one error expected
 // (empty: none).

@@ -43,7 +43,7 @@ TEST(EvalCrossCheck, AgreesWithIcarusVerilogWhereTheRulesAgree) {
         ++count;
         Tn_VerilogExpression* e = b.expr(f[0]);
         EXPECT_FALSE(e->typeAs(ctx, Tn_Verilog::Value)->isError()) << f[0];
-        const std::string got = valueText(e->value());
+        const std::string got = Tn_VerilogValue::evalText(e->value()).str();
         if (record) out << f[0] << '\t' << got << '\n';
         const std::string& expected = f.size() == 4 ? f[2] : f[1];
         EXPECT_EQ(got, expected) << f[0] << "\n  iverilog: " << f[1];

@@ -9,7 +9,7 @@ namespace {
 
 using namespace Tn_Verilog;
 
-std::string text(const Tn_VerilogValuePtr& v) { return valueText(v); }
+std::string text(const Tn_VerilogValuePtr& v) { return Tn_VerilogValue::evalText(v).str(); }
 
 struct Eval : CheckFixture {
     // The expression checked in m, then evaluated self-determined.
