@@ -34,7 +34,6 @@ public:
 
 private:
     static const Port_String* intern(const char* text, size_t length);
-    static const Port_String* empty() { return &s_empty; }
     static const Port_String s_empty;
     const Port_String* s_;
 };

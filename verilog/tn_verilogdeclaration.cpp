@@ -35,12 +35,8 @@ Port_String Tn_VerilogPort::describe() const { return Port_String::doFormat("por
 
 namespace {
 
-// Ranges are asked for their bounds before anything checked them: their names
-// resolve from the declaration's scope.
 void resolveRangeNames(Tn_VerilogRange* r, const Tn_VerilogScope* scope) {
-    if (!r) return;
-    if (r->Msb) r->Msb->resolveNames(scope);
-    if (r->Lsb) r->Lsb->resolveNames(scope);
+    if (r) r->resolveNames(scope);
 }
 
 }  // namespace

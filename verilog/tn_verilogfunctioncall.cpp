@@ -29,14 +29,6 @@ Tn_VerilogTypePtr resultLike(const Tn_VerilogTypePtr& t) {
     return t;
 }
 
-uint32_t widthOf(const Tn_VerilogTypePtr& t) {
-    if (!t) return 1;
-    if (t->isRealType()) return 64;
-    if (!t->isVector()) return 1;
-    int64_t w = static_cast<int64_t>(t->msb()) - t->lsb();
-    return static_cast<uint32_t>((w < 0 ? -w : w) + 1);
-}
-
 }  // namespace
 
 // A call with constant arguments (of a constant function) is constant.
@@ -152,15 +144,15 @@ Tn_VerilogValuePtr Tn_VerilogUserFunctionCall::evaluate(const Tn_VerilogEvalCont
 
 uint32_t Tn_VerilogUserFunctionCall::contextWidth(uint32_t width) const {
     Tn_VerilogFunction* f = function();
-    return f ? atLeast(widthOf(f->type()->returnType()), width) : width;
+    return f ? atLeast(f->width(), width) : width;
 }
 
 bool Tn_VerilogUserFunctionCall::isReal() const {
     Tn_VerilogFunction* f = function();
-    return f && f->type()->returnType()->isRealType();
+    return f && f->isReal();
 }
 
 bool Tn_VerilogUserFunctionCall::isSigned(bool contextSigned) const {
     Tn_VerilogFunction* f = function();
-    return contextSigned && f && f->type()->returnType()->isSignedType();
+    return contextSigned && f && f->resultType()->isSignedType();
 }

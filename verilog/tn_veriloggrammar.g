@@ -427,7 +427,7 @@ instantiation[Tn_VerilogAttributes* a]
 
 parameterValueAssignment[Tn_VerilogInstSpec& s]
 { Tn_VerilogTok lp; Tn_VerilogExpression* e = 0; }
-    : HASH { s.hasParameters = true; }
+    : HASH
       ( e=delayValue { paramValue(s, Tn_VerilogTok(), e); }
       | { lp = tok(); } LPAREN ( parameterValue[s] ( COMMA parameterValue[s] )* )? RPAREN
       )

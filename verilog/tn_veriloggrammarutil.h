@@ -55,7 +55,6 @@ struct Tn_VerilogDeclSpec {
     Tn_VerilogRange* range = nullptr;
     Tn_VerilogDelay* delay = nullptr;
     Tn_VerilogTypeDef* typeDef = nullptr;
-    int count = 0;                             // names declared so far
 };
 
 // A parameter, localparam or specparam declaration being read.
@@ -78,7 +77,6 @@ struct Tn_VerilogInstSpec {
     Tn_VerilogDriveStrength* strength = nullptr;
     Tn_VerilogDelay* delay = nullptr;
     size_t paramsBegin = 0;                    // parameter values: a range of the parser's list
-    bool hasParameters = false;
     int count = 0;                             // instances made so far
 };
 

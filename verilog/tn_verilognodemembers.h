@@ -674,7 +674,10 @@ public:
     bool bounds(int32_t& msb, int32_t& lsb) const;                                                    \
     /* |msb - lsb| + 1, or 1 when the bounds do not evaluate. */                                     \
     uint32_t width() const;                                                                           \
-    bool isLiteral() const;
+    bool isLiteral() const;                                                                           \
+    /* Ranges are asked for their bounds before anything checked them: */                            \
+    /* the names of the bounds resolve from the declaration's scope. */                               \
+    void resolveNames(const Tn_VerilogScope* scope);
 
 #define TN_HAS_MEMBERS_Delay TN_PROBE
 #define TN_MEMBERS_Delay Tn_VerilogTypePtr check(Tn_VerilogElabContext& ctx);

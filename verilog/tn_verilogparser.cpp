@@ -430,7 +430,6 @@ struct Tn_VerilogParser::Impl {
     std::unordered_set<Tn_Symbol> constantCallSet;
     std::vector<std::pair<Tn_VerilogFunction*, Tn_Symbol>> callsInFunctions;
     int functionDepth = 0;
-    size_t firstNode = 0;
 
     // UDPs.
     std::vector<UdpPort> udpPorts;
@@ -798,7 +797,6 @@ Tn_VerilogVariable* declareObject(Impl& d, Tn_VerilogDeclSpec& s, const Tn_Veril
     v->TypeDef = type;
     v->Attributes = s.attributes;
     if (declareName(d, v, name, loc)) d.scope().region->Variable.insert(name, v);
-    ++s.count;
     return v;
 }
 
@@ -2500,15 +2498,12 @@ Tn_VerilogExpression* Tn_VerilogParser::nameEnd(size_t mark) {
         if (words > 0) {
             Tn_VerilogWordSelect* w = d.f().createWordSelect(loc);
             w->Operand = static_cast<Tn_VerilogName*>(e);
-            unsigned depth = 0;
             for (size_t i = begin; i < begin + words; ++i) {
                 const Impl::Select& sel = d.selects[i];
                 if (sel.kind != 0) throw syntaxError(sel.bracket, "only the last select may be a part-select");
                 w->Index.push_back(sel.e1);
-                depth = std::max<unsigned>(depth, d.depthOf(sel.e1));
             }
             e = deep(d, w, {e});
-            if (depth + 1 > d.depthOf(w)) deepen(d, w, d.selects[begin].e1);
             for (size_t i = begin; i < begin + words; ++i) deepen(d, w, d.selects[i].e1);
         }
         if (begin + words + 1 < end) throw syntaxError(d.selects[begin + words + 1].bracket, "too many selects");

@@ -31,16 +31,12 @@ Port_String Tn_VerilogFunction::describe() const { return Port_String::doFormat(
 // or as a bare range; without either it is one unsigned bit.
 Tn_VerilogTypePtr Tn_VerilogFunction::resultType() const {
     if (Tn_VerilogTypeDef* t = Tn_VerilogNode::cast<Tn_VerilogTypeDef>(ReturnType)) {
-        if (Tn_VerilogRange* r = t->range()) {
-            if (r->Msb) r->Msb->resolveNames(Parent);
-            if (r->Lsb) r->Lsb->resolveNames(Parent);
-        }
+        if (Tn_VerilogRange* r = t->range()) r->resolveNames(Parent);
         return t->type();
     }
     if (Tn_VerilogRange* r = Tn_VerilogNode::cast<Tn_VerilogRange>(ReturnType)) {
         int32_t msb, lsb;
-        if (r->Msb) r->Msb->resolveNames(Parent);
-        if (r->Lsb) r->Lsb->resolveNames(Parent);
+        r->resolveNames(Parent);
         if (r->bounds(msb, lsb)) return Tn_VerilogType::createVector(false, msb, lsb);
     }
     return Tn_VerilogType::createScalar(false);
@@ -60,7 +56,10 @@ uint32_t Tn_VerilogFunction::width() const {
     return static_cast<uint32_t>(span < 0 ? -span : span) + 1;
 }
 
-bool Tn_VerilogFunction::isSigned() const { return resultType()->isSignedType() || resultType()->isRealType(); }
+bool Tn_VerilogFunction::isSigned() const {
+    const Tn_VerilogTypePtr t = resultType();
+    return t->isSignedType() || t->isRealType();
+}
 bool Tn_VerilogFunction::isReal() const { return resultType()->isRealType(); }
 
 bool Tn_VerilogFunction::bounds(int32_t& msb, int32_t& lsb) const {

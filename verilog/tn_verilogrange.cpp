@@ -70,6 +70,11 @@ uint32_t Tn_VerilogRange::width() const {
     return w > UINT32_MAX ? UINT32_MAX : static_cast<uint32_t>(w);
 }
 
+void Tn_VerilogRange::resolveNames(const Tn_VerilogScope* scope) {
+    if (Msb) Msb->resolveNames(scope);
+    if (Lsb) Lsb->resolveNames(scope);
+}
+
 bool Tn_VerilogRange::isLiteral() const { return Msb && Lsb && Msb->isLiteral() && Lsb->isLiteral(); }
 
 Tn_VerilogTypePtr Tn_VerilogDelay::check(Tn_VerilogElabContext& ctx) {

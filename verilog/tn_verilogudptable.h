@@ -42,7 +42,6 @@ public:
 
     // Pairs of rows compared so far (the comparison stops at a budget, so a
     // table of absurd size cannot make the check quadratic forever).
-    size_t comparisons() const { return comparisons_; }
 
 private:
     // A column: a set of values (bit 0: 0, bit 1: 1, bit 2: x) for a level,
