@@ -8,13 +8,6 @@
 
 namespace {
 
-std::vector<std::string> split(const std::string& text, char sep) {
-    std::vector<std::string> r;
-    std::stringstream in(text);
-    for (std::string piece; std::getline(in, piece, sep);) r.push_back(piece);
-    return r;
-}
-
 std::vector<std::string> words(const std::string& text) {
     std::vector<std::string> r;
     std::istringstream in(text);
@@ -82,6 +75,23 @@ std::vector<CorpusCase> readParserCorpus() {
         cases.push_back(k);
     }
     return cases;
+}
+
+std::vector<CorpusCase> readParserCompilations() {
+    std::vector<CorpusCase> first;
+    for (const CorpusCase& c : readParserCorpus())
+        if (first.empty() || first.back().compilation() != c.compilation()) first.push_back(c);
+    return first;
+}
+
+std::vector<std::string> CorpusCase::args(const std::vector<std::string>& fileList, const std::string& dir) const {
+    const std::string prefix = dir.empty() ? "" : dir + "/";
+    std::vector<std::string> r;
+    for (const std::string& f : fileList) r.push_back(prefix + f);
+    for (const std::string& d : includeDirs) r.push_back("+incdir+" + prefix + d);
+    for (const std::string& d : defines) r.push_back("+define+" + d);
+    if (mode == "1995") r.push_back("-1995");
+    return r;
 }
 
 std::string applyUnifiedDiff(const std::string& original, const std::string& diff) {

@@ -20,6 +20,12 @@ struct CorpusCase {
     std::vector<std::string> faultLevels;    // "error" / "warning", one per message
     std::vector<std::string> faultMessages;  // exact texts, or "syntax@<file>:<line>"
     std::string notes;
+
+    // "<compilation>" of the name.
+    std::string compilation() const { return name.substr(0, name.find('/')); }
+    // The command line of a file list: dir/file for each file (as given when
+    // dir is empty), include directories (under dir too), macros and mode.
+    std::vector<std::string> args(const std::vector<std::string>& fileList, const std::string& dir = "") const;
 };
 
 // One design of the shared corpus of real designs: its directory name, its
@@ -36,6 +42,8 @@ bool readSharedDesigns(std::vector<SharedDesign>& designs);
 
 // Every row of the manifest, in order.
 std::vector<CorpusCase> readParserCorpus();
+// The first row of each compilation, in order.
+std::vector<CorpusCase> readParserCompilations();
 // The corpus directory in the source tree.
 std::string parserCorpusDir();
 // Applies a unified diff (as diff -u writes it) to text; throws

@@ -60,3 +60,10 @@ CommandResult runCommand(const std::string& command) {
 }
 
 CommandResult runTarn(const std::string& arguments) { return runCommand(std::string(TARN_BIN) + " " + arguments); }
+
+std::vector<std::string> split(const std::string& text, char sep) {
+    std::vector<std::string> r;
+    std::stringstream in(text);
+    for (std::string piece; std::getline(in, piece, sep);) r.push_back(piece);
+    return r;
+}

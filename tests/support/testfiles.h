@@ -3,6 +3,7 @@
 #define TARN_TESTS_TESTFILES_H
 
 #include <string>
+#include <vector>
 
 class TempDir {
 public:
@@ -32,5 +33,7 @@ CommandResult runCommand(const std::string& command);
 // Runs the built tarn binary with arguments (already shell-quoted as needed).
 CommandResult runTarn(const std::string& arguments);
 std::string readFile(const std::string& path);
+// The pieces of text between separators (a final empty piece is dropped).
+std::vector<std::string> split(const std::string& text, char sep);
 
 #endif

@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <unistd.h>
 
 #include "tests/support/parse.h"
 #include "tests/support/parsercorpus.h"
@@ -17,12 +16,8 @@ struct Outcome {
 };
 
 Outcome parseCase(const CorpusCase& c, const std::vector<std::string>& files) {
-    std::vector<std::string> args = files;
-    for (const std::string& d : c.includeDirs) args.push_back("+incdir+" + d);
-    for (const std::string& d : c.defines) args.push_back("+define+" + d);
-    if (c.mode == "1995") args.push_back("-1995");
     CaptureSink sink;
-    ParseResult r = parseArgs(args);
+    ParseResult r = parseArgs(c.args(files));
     Outcome o;
     for (const CaptureSink::Message& m : sink.messages) {
         if (m.level == PORT_MSG_STATUS) continue;
@@ -35,16 +30,12 @@ Outcome parseCase(const CorpusCase& c, const std::vector<std::string>& files) {
 
 
 TEST_F(ParserCorpusTest, CleanCompilationsParseWithoutMessagesToTheirTops) {
-    std::string last;
     int compilations = 0;
-    for (const CorpusCase& c : readParserCorpus()) {
-        const std::string compilation = c.name.substr(0, c.name.find('/'));
-        if (compilation == last) continue;
-        last = compilation;
+    for (const CorpusCase& c : readParserCompilations()) {
         ++compilations;
         const Outcome o = parseCase(c, c.files);
-        EXPECT_EQ(o.messages, std::vector<std::string>{}) << compilation;
-        EXPECT_EQ(o.tops, c.tops) << compilation;
+        EXPECT_EQ(o.messages, std::vector<std::string>{}) << c.compilation();
+        EXPECT_EQ(o.tops, c.tops) << c.compilation();
     }
     EXPECT_GE(compilations, 30);
 }

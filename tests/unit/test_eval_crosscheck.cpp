@@ -8,21 +8,9 @@
 #include <cstdlib>
 #include <fstream>
 #include <map>
-#include <sstream>
 
 #include "tests/support/checkfixture.h"
-
-namespace {
-
-std::vector<std::string> fields(const std::string& line) {
-    std::vector<std::string> r;
-    std::stringstream in(line);
-    std::string f;
-    while (std::getline(in, f, '\t')) r.push_back(f);
-    return r;
-}
-
-}  // namespace
+#include "tests/support/testfiles.h"
 
 TEST(EvalCrossCheck, AgreesWithIcarusVerilogWhereTheRulesAgree) {
     std::ifstream in(TARN_TEST_DATA "/eval/expected.tsv");
@@ -38,7 +26,7 @@ TEST(EvalCrossCheck, AgreesWithIcarusVerilogWhereTheRulesAgree) {
     int count = 0, agree = 0;
     std::string line;
     while (std::getline(in, line)) {
-        const std::vector<std::string> f = fields(line);
+        const std::vector<std::string> f = split(line, '\t');
         ASSERT_TRUE(f.size() == 2 || f.size() == 4) << line;
         ++count;
         Tn_VerilogExpression* e = b.expr(f[0]);

@@ -3,8 +3,6 @@
 // port redeclarations, and silence on clean sources.
 #include <gtest/gtest.h>
 
-#include <set>
-
 #include "tests/support/parse.h"
 #include "tests/support/parsercorpus.h"
 #include "verilog/tn_verilogelabcontext.h"
@@ -250,16 +248,7 @@ TEST_F(Modules, CleanSourcesCheckWithoutMessages) {
     // Compilations of the parser corpus (each row names a fault of one
     // compilation; its files are the clean ones).
     int checked = 0;
-    std::set<std::string> compilations;
-    for (const CorpusCase& c : readParserCorpus()) {
-        if (!compilations.insert(c.name.substr(0, c.name.find('/'))).second) continue;
-        std::vector<std::string> args;
-        for (const std::string& f : c.files) args.push_back(parserCorpusDir() + "/" + f);
-        for (const std::string& d : c.includeDirs) args.push_back("+incdir+" + parserCorpusDir() + "/" + d);
-        for (const std::string& d : c.defines) args.push_back("+define+" + d);
-        if (c.mode == "1995") args.push_back("-95");
-        checked += checkCompilation(args, c.name);
-    }
+    for (const CorpusCase& c : readParserCompilations()) checked += checkCompilation(c.args(c.files, parserCorpusDir()), c.name);
     EXPECT_GT(checked, 40);
 }
 

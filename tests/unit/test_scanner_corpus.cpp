@@ -3,10 +3,6 @@
 // exactly as the corpus expects.
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <sstream>
-#include <unistd.h>
-
 #include "tests/support/capturesink.h"
 #include "tests/support/parsercorpus.h"
 #include "tests/support/scan.h"
@@ -56,12 +52,8 @@ class ParserCorpusScan : public ParserCorpusTest {
 protected:
     // The scanner's errors and warnings for a file list, then its error.
     std::vector<std::string> messages(const CorpusCase& c, const std::vector<std::string>& files) {
-        std::vector<std::string> args = files;
-        for (const std::string& d : c.includeDirs) args.push_back("+incdir+" + d);
-        for (const std::string& d : c.defines) args.push_back("+define+" + d);
-        if (c.mode == "1995") args.push_back("-1995");
         CaptureSink sink;
-        ScanResult r = scanArgs(args);
+        ScanResult r = scanArgs(c.args(files));
         std::vector<std::string> out;
         for (const CaptureSink::Message& m : sink.messages)
             if (m.level != PORT_MSG_STATUS) out.push_back(m.text.substr(0, m.text.size() - 1));
@@ -72,13 +64,8 @@ protected:
 };
 
 TEST_F(ParserCorpusScan, CleanCompilationsScanWithoutMessages) {
-    std::string last;
-    for (const CorpusCase& c : readParserCorpus()) {
-        const std::string compilation = c.name.substr(0, c.name.find('/'));
-        if (compilation == last) continue;
-        last = compilation;
-        EXPECT_EQ(messages(c, c.files), std::vector<std::string>{}) << compilation;
-    }
+    for (const CorpusCase& c : readParserCompilations())
+        EXPECT_EQ(messages(c, c.files), std::vector<std::string>{}) << c.compilation();
 }
 
 TEST_F(ParserCorpusScan, ScannerFaultsAreReportedAsExpected) {
