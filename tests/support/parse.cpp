@@ -90,10 +90,10 @@ std::string shape(Tn_VerilogNode* e) {
     return o.str();
 }
 
-std::string dumpOf(Tn_VerilogNode* n) {
+std::string dumpOf(const Tn_VerilogNode* n, const char* label) {
     Tn_OStringStream out;
-    n->dump(out, "Node", 0);
-    return out.str().c_str();
+    n->dump(out, label, 0);
+    return out.str().str();
 }
 
 ParseResult ParseTest::parse(const std::string& source, const std::vector<std::string>& args) {

@@ -34,7 +34,7 @@ ParseResult parseArgs(const std::vector<std::string>& args);
 // Compact text of an expression tree: (op l r), (?: c t f), names, numbers.
 std::string shape(Tn_VerilogNode* e);
 // The dump of a node as the dump format prints it.
-std::string dumpOf(Tn_VerilogNode* n);
+std::string dumpOf(const Tn_VerilogNode* n, const char* label = "Node");
 
 // A fixture writing sources into a scratch directory as t.v and parsing them.
 class ParseTest : public ::testing::Test {

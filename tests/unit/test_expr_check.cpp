@@ -6,6 +6,7 @@
 #include <cctype>
 
 #include "tests/support/checkfixture.h"
+#include "tests/support/parse.h"
 #include "util/tn_ostream.h"
 #include "verilog/tn_verilogcallchecker.h"
 #include "verilog/tn_verilogsystf.h"
@@ -250,11 +251,6 @@ struct Copies : Check {
         Tn_VerilogElabContext& c = target.context(m);
         return c;
     }
-    std::string dump(const Tn_VerilogNode* n) {
-        Tn_OStringStream out;
-        n->dump(out, "E", 0);
-        return out.str().str();
-    }
 };
 
 }  // namespace
@@ -268,7 +264,7 @@ TEST_F(Copies, PlainCopiesRecreateEveryOperatorInTheTargetUnit) {
     // Same tree, except that the copies' ids are those of the target unit and
     // the names are not resolved there yet.
     auto shape = [&](const Tn_VerilogNode* n) {
-        std::string s = dump(n), r;
+        std::string s = dumpOf(n, "E"), r;
         for (size_t i = 0; i < s.size(); ++i) {
             if (s.compare(i, 3, " = ") == 0 && i + 3 < s.size() && std::isdigit(static_cast<unsigned char>(s[i + 3]))) {
                 r += " = #";

@@ -7,6 +7,7 @@
 #include <sstream>
 
 #include "tests/support/capturesink.h"
+#include "tests/support/parse.h"
 #include "util/tn_ostream.h"
 #include "verilog/tn_verilogdesign.h"
 #include "verilog/tn_verilogdesignunit.h"
@@ -44,11 +45,6 @@ struct Unit {
     Tn_VerilogNodeFactory& f = unit.factory();
 };
 
-std::string dumpText(const Tn_VerilogNode* n, const char* label) {
-    Tn_OStringStream out;
-    n->dump(out, label, 0);
-    return out.str().str();
-}
 
 }  // namespace
 
@@ -244,7 +240,7 @@ TEST(NodeDump, SmallTreePrintsInTheDumpFormat) {
     neg->OpType = static_cast<UnaryOpType>(42);
     neg->Operand = half;
     half->Value = 0.5;
-    EXPECT_EQ(dumpText(ca, "ContAssign"),
+    EXPECT_EQ(dumpOf(ca, "ContAssign"),
               "ContAssign:Tn_VerilogContAssign = 1 {\n"
               "  Location = a.v:3\n"
               "  Attributes:Tn_VerilogAttributes = 7 {\n"
@@ -297,13 +293,13 @@ TEST(NodeDump, ListsMapsAndReferencesPrintPerEntry) {
     Tn_VerilogGenerateArray* ga = u.f.createGenerateArray();
     ga->Generate.insert(5, u.f.createGenerate());
     ga->Generate.insert(-1, u.f.createGenerate());
-    const std::string port = dumpText(p, "Port");
+    const std::string port = dumpOf(p, "Port");
     EXPECT_NE(port.find("\n  Index:Port::INT32 = 2\n  Direction:Tn_Verilog::PortDirectionType = OutputPort\n"
                         "  HiConn:Tn_VerilogExpression = nil\n  LoConn:Tn_VerilogExpression = nil\n"
                         "  NamedPortConnectionFlag:bool = true\n}\n"),
               std::string::npos)
         << port;
-    const std::string arr = dumpText(ga, "GenerateArray");
+    const std::string arr = dumpOf(ga, "GenerateArray");
     // Elements in index order, each under the map's label.
     EXPECT_NE(arr.find("  Generate:Tn_VerilogGenerate = 3 {"), std::string::npos);
     EXPECT_LT(arr.find("Generate:Tn_VerilogGenerate = 3"), arr.find("Generate:Tn_VerilogGenerate = 2"));
@@ -376,7 +372,7 @@ TEST(NodeCopy, ValuesAreCopiedMemberwise) {
     EXPECT_EQ(c->TableRow.str().str(), "0 1 : 1");
     EXPECT_EQ(static_cast<TableRowType>(c->RowType), LevelRow);
     EXPECT_EQ(c->location().line, 9);
-    EXPECT_EQ(dumpText(c, "X").substr(dumpText(c, "X").find('\n')), dumpText(t, "X").substr(dumpText(t, "X").find('\n')));
+    EXPECT_EQ(dumpOf(c, "X").substr(dumpOf(c, "X").find('\n')), dumpOf(t, "X").substr(dumpOf(t, "X").find('\n')));
 }
 
 TEST(NodeMap, GrowsAndComparesNodesNotIds) {

@@ -142,9 +142,7 @@ TEST_F(ParserErrors, TreesAsDeepAsAllowedCanBeWalked) {
     // Dumps indent by depth, so a deep tree makes a long dump; one of a
     // thousand levels.
     m = clean("module m;\nwire w = " + repeat("a - ", 1000) + "a;\nendmodule\n");
-    Tn_OStringStream out;
-    m->dump(out, "Module", 0);
-    EXPECT_GT(out.str().GetLength(), 1000 * 100);
+    EXPECT_GT(dumpOf(m, "Module").size(), 1000u * 100);
 }
 
 }  // namespace

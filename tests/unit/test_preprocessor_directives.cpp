@@ -18,13 +18,17 @@ typedef Tn_VerilogTokenTypes T;
 
 class Directives : public ScanTest {
 protected:
-    // Scans source (with further arguments) and keeps the driver for its state.
-    ScanResult run(const std::string& source, std::vector<std::string> args = {}) {
+    // Starts scanning source (with further arguments); the driver is kept
+    // for its state.
+    void start(const std::string& source, std::vector<std::string> args = {}) {
         args.insert(args.begin(), dir.write("t.v", source));
         Tn_StringList list{Port_String("tarn")};
         for (const std::string& a : args) list.push_back(Port_String(a));
         driver.reset(new Tn_VerilogCompiler());
         EXPECT_TRUE(driver->scanSources(list));
+    }
+    ScanResult run(const std::string& source, const std::vector<std::string>& args = {}) {
+        start(source, args);
         return drainTokens(driver->lexer());
     }
     std::string text(const std::string& source, const std::vector<std::string>& args = {}) {
@@ -219,9 +223,7 @@ TEST_F(Directives, IncludeFilesOpenedInACompilationAreBounded) {
     }
     dir.write("b9.vh", "x\n");
     auto scan = [&](size_t limit) {
-        driver.reset(new Tn_VerilogCompiler());
-        EXPECT_TRUE(driver->scanSources({"tarn", Port_String(dir.write("t.v", "`include \"b0.vh\"\n")),
-                                         Port_String("+incdir+" + dir.path())}));
+        start("`include \"b0.vh\"\n", {"+incdir+" + dir.path()});
         driver->lexer().state().includeLimit = limit;
         return drainTokens(driver->lexer());
     };
