@@ -238,32 +238,6 @@ bool iequals(const std::string& a, const char* b) {
     return true;
 }
 
-// The value of a decimal digit string modulo 2^width, as binary digits.
-// Digits beyond the lowest `width` do not change it (10^k is a multiple of
-// 2^width when k >= width), so the work is bounded by the width.
-std::string decimalToBinary(const std::string& digits, uint32_t width) {
-    size_t start = digits.size() > width ? digits.size() - width : 0;
-    std::vector<uint32_t> words((width + 31) / 32 + 1, 0);
-    size_t i = start;
-    while (i < digits.size()) {
-        uint32_t chunk = 0, scale = 1;
-        for (int k = 0; k < 9 && i < digits.size(); ++k, ++i) {
-            chunk = chunk * 10 + static_cast<uint32_t>(digits[i] - '0');
-            scale *= 10;
-        }
-        uint64_t carry = chunk;
-        for (uint32_t& w : words) {
-            uint64_t t = uint64_t(w) * scale + carry;
-            w = static_cast<uint32_t>(t);
-            carry = t >> 32;
-        }
-    }
-    std::string bits(width, '0');
-    for (uint32_t b = 0; b < width; ++b)
-        if (words[b / 32] >> (b % 32) & 1) bits[width - 1 - b] = '1';
-    return bits;
-}
-
 }  // namespace
 
 Tn_VerilogExpressionSyntaxError::Tn_VerilogExpressionSyntaxError(const Port_String& message)
@@ -2645,12 +2619,6 @@ Tn_VerilogExpression* Tn_VerilogParser::basedConstant(const Tn_VerilogTok& size,
         if (static_cast<double>(text.size()) > limit)
             warning(loc, "%sToo many digits specified in %s constant\n", word);
     }
-    if (radix == V::Decimal && width > 64 && std::isdigit(static_cast<unsigned char>(text[0]))) {
-        const std::string bits = decimalToBinary(text, width);
-        c->Value = Tn_VerilogVector(V::Binary, isSigned, width, bits.data(), bits.size());
-        c->Value.setBase(V::Decimal);
-    } else {
-        c->Value = Tn_VerilogVector(radix, isSigned, width, text.data(), text.size());
-    }
+    c->Value = Tn_VerilogVector(radix, isSigned, width, text.data(), text.size());
     return c;
 }

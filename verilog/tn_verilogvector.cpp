@@ -830,12 +830,25 @@ Tn_VerilogVector::Tn_VerilogVector(Tn_Verilog::BaseType base, bool isSigned, uin
             w[0].a = static_cast<uint32_t>(v);
             if (n > 1) w[1].a = static_cast<uint32_t>(v >> 32);
         } else {
-            for (; i < length; ++i) {
-                char c = digits[i];
-                if (c == '_') continue;
-                uint64_t carry = static_cast<uint64_t>(c >= '0' && c <= '9' ? c - '0' : 0);
+            // Digits above the lowest `width` do not change the value modulo
+            // 2^width (10^k is a multiple of 2^k), so they are skipped, and
+            // the rest are taken nine at a time: the work is bounded by the
+            // width, not by the length of the text.
+            size_t count = 0;
+            for (size_t j = i; j < length; ++j) count += digits[j] != '_';
+            for (; count > width_ && i < length; ++i) count -= digits[i] != '_';
+            while (i < length) {
+                uint32_t chunk = 0, scale = 1;
+                for (int k = 0; k < 9 && i < length; ++i) {
+                    const char c = digits[i];
+                    if (c == '_') continue;
+                    chunk = chunk * 10 + static_cast<uint32_t>(c >= '0' && c <= '9' ? c - '0' : 0);
+                    scale *= 10;
+                    ++k;
+                }
+                uint64_t carry = chunk;
                 for (uint32_t k = 0; k < n; ++k) {
-                    uint64_t t = uint64_t(w[k].a) * 10 + carry;
+                    const uint64_t t = uint64_t(w[k].a) * scale + carry;
                     w[k].a = static_cast<uint32_t>(t);
                     carry = t >> 32;
                 }
