@@ -1011,7 +1011,7 @@ binaryExpression returns [Tn_VerilogExpression* e = 0]
         // Arithmetic shifts and the power operator are Verilog-2001.
         | { v2001() }? ( ASHIFT_LEFT | ASHIFT_RIGHT | POWER )
         )
-        a=attributeInstances { binaryOperator(op, a); }
+        a=attributeInstances { binaryOperator(m, op, a); }
         e=unaryExpression
       )*
       { e = binaryEnd(m, e); }

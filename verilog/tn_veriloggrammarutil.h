@@ -334,7 +334,7 @@ protected:
     virtual Tn_VerilogExpression* conditionalEnd(size_t mark, Tn_VerilogExpression* last) = 0;
     virtual size_t binaryBegin() = 0;
     virtual void binaryOperand(Tn_VerilogExpression* e) = 0;
-    virtual void binaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) = 0;
+    virtual void binaryOperator(size_t mark, const Tn_VerilogTok& op, Tn_VerilogAttributes* a) = 0;
     virtual Tn_VerilogExpression* binaryEnd(size_t mark, Tn_VerilogExpression* last) = 0;
     virtual size_t unaryBegin() = 0;
     virtual void unaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) = 0;

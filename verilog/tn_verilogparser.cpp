@@ -422,10 +422,7 @@ struct Tn_VerilogParser::Impl {
     std::vector<NamePart> nameParts;
     std::vector<Select> selects;
     std::vector<TimingArgument> timingArguments;
-    Tn_VerilogTok timingKeyword;
     V::EdgeType pathEdge = V::NoEdge;
-    // Binary operator stack bases of the expressions being read.
-    std::vector<size_t> binaryFrames;
     std::vector<Tn_VerilogStatement*> caseStack;
     // Depth of each expression and statement node built, by node id.
     std::vector<uint16_t> depths;
@@ -499,7 +496,7 @@ void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn
     try {
         sourceText();
     } catch (const antlr::TokenStreamRecognitionException& e) {
-        TN_MSG().issueError("\"%s\" line %d %s\n", e.getFilename().c_str(), e.getLine(), e.getMessage().c_str());
+        Tn_VerilogLexer::report(e);
     } catch (const NestingException& e) {
         TN_MSG().issueError("\"%s\" line %d %s\n", e.file.c_str(), e.line, e.getMessage().c_str());
     } catch (const antlr::RecognitionException& e) {
@@ -1866,7 +1863,6 @@ Tn_VerilogNode* Tn_VerilogParser::timingCheckBegin(const Tn_VerilogTok& keyword,
     c->Attributes = a;
     d.module->Tchk.push_back(c);
     d.timingArguments.clear();
-    d.timingKeyword = keyword;
     return c;
 }
 
@@ -1881,7 +1877,7 @@ void Tn_VerilogParser::timingCheckEnd(Tn_VerilogNode* node, const Tn_VerilogTok&
     const TimingCheckShape shape = timingCheckShape(c->TchkType);
     const std::vector<Impl::TimingArgument>& args = d.timingArguments;
     const size_t fixed = static_cast<size_t>(shape.events + shape.limits);
-    const std::string keyword = textOf(d.timingKeyword);
+    const std::string keyword = V::TchkTypeInfo.text(c->TchkType);
     if (args.size() < fixed || args.size() > fixed + static_cast<size_t>(shape.extras))
         throw syntaxError(paren, "wrong number of arguments to " + keyword);
     for (size_t i = 0; i < args.size(); ++i) {
@@ -2300,26 +2296,22 @@ void reduce(Impl& d) {
 
 }  // namespace
 
-size_t Tn_VerilogParser::binaryBegin() {
-    d_->binaryFrames.push_back(d_->operators.size());
-    return d_->binaryFrames.size();
-}
+// The mark of an expression is the operator stack's size at its start:
+// operators below it belong to enclosing expressions.
+size_t Tn_VerilogParser::binaryBegin() { return d_->operators.size(); }
 
 void Tn_VerilogParser::binaryOperand(Tn_VerilogExpression* e) { d_->operands.push_back(e); }
 
-void Tn_VerilogParser::binaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) {
+void Tn_VerilogParser::binaryOperator(size_t base, const Tn_VerilogTok& op, Tn_VerilogAttributes* a) {
     Impl& d = *d_;
     BinaryOperator b{V::LogicalOr, 0};
     ::binaryOperator(op.type, b);
-    const size_t base = d.binaryFrames.back();
     while (d.operators.size() > base && d.operators.back().op.precedence >= b.precedence) reduce(d);
     d.operators.push_back(Impl::Operator{op, a, b});
 }
 
-Tn_VerilogExpression* Tn_VerilogParser::binaryEnd(size_t, Tn_VerilogExpression* last) {
+Tn_VerilogExpression* Tn_VerilogParser::binaryEnd(size_t base, Tn_VerilogExpression* last) {
     Impl& d = *d_;
-    const size_t base = d.binaryFrames.back();
-    d.binaryFrames.pop_back();
     if (d.operators.size() == base) return last;
     d.operands.push_back(last);
     while (d.operators.size() > base) reduce(d);

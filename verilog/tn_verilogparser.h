@@ -223,7 +223,7 @@ protected:
     Tn_VerilogExpression* conditionalEnd(size_t mark, Tn_VerilogExpression* last) override;
     size_t binaryBegin() override;
     void binaryOperand(Tn_VerilogExpression* e) override;
-    void binaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) override;
+    void binaryOperator(size_t mark, const Tn_VerilogTok& op, Tn_VerilogAttributes* a) override;
     Tn_VerilogExpression* binaryEnd(size_t mark, Tn_VerilogExpression* last) override;
     size_t unaryBegin() override;
     void unaryOperator(const Tn_VerilogTok& op, Tn_VerilogAttributes* a) override;
