@@ -746,10 +746,10 @@ pathDeclaration[Tn_VerilogAttributes* a]
     ;
 
 pathDescription[Tn_VerilogNode* p]
-{ Tn_VerilogExpression* e = 0; }
+{ Tn_VerilogExpression* e = 0; int edge = 0; }
     : LPAREN
-      ( K_POSEDGE { pathEdge(p, K_POSEDGE); } | K_NEGEDGE { pathEdge(p, K_NEGEDGE); } )?
-      e=name { pathInput(p, e); } ( COMMA e=name { pathInput(p, e); } )*
+      ( K_POSEDGE { edge = K_POSEDGE; } | K_NEGEDGE { edge = K_NEGEDGE; } )?
+      e=name { pathInput(p, e, edge); } ( COMMA e=name { pathInput(p, e, edge); } )*
       ( PLUS { pathPolarity(p, PLUS, false); } | MINUS { pathPolarity(p, MINUS, false); } )?
       ( PARALLEL_PATH { pathType(p, PARALLEL_PATH); } | FULL_PATH { pathType(p, FULL_PATH); } )
       ( LPAREN e=name { pathOutput(p, e); } ( COMMA e=name { pathOutput(p, e); } )*
@@ -871,10 +871,10 @@ caseStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]
 
 caseItem[Tn_VerilogStatement* c]
 { Tn_VerilogTok d; Tn_VerilogStatement* i = 0; Tn_VerilogExpression* e = 0; Tn_VerilogStatement* s = 0; }
-    : { d = tok(); } K_DEFAULT ( COLON )? { i = caseItemBegin(c, d); } s=statement { caseItemBody(i, s); }
+    : { d = tok(); } K_DEFAULT ( COLON )? { i = caseItemBegin(c, d); } s=statement { caseItemBody(c, i, s); }
     | { i = caseItemBegin(c, tok()); }
       e=expression { caseItemExpression(i, e); } ( COMMA e=expression { caseItemExpression(i, e); } )*
-      COLON s=statement { caseItemBody(i, s); }
+      COLON s=statement { caseItemBody(c, i, s); }
     ;
 
 loopStatement[Tn_VerilogAttributes* a] returns [Tn_VerilogStatement* s = 0]

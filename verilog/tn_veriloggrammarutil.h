@@ -258,8 +258,7 @@ protected:
     virtual void pulseControlOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
     virtual Tn_VerilogNode* pathBegin(const Tn_VerilogTok& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* condition,
                                       bool ifnone) = 0;
-    virtual void pathEdge(Tn_VerilogNode* p, int edge) = 0;
-    virtual void pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
+    virtual void pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e, int edge) = 0;
     virtual void pathPolarity(Tn_VerilogNode* p, int sign, bool data) = 0;
     virtual void pathType(Tn_VerilogNode* p, int type) = 0;
     virtual void pathOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) = 0;
@@ -305,7 +304,7 @@ protected:
     virtual void caseSelector(Tn_VerilogStatement* c, Tn_VerilogExpression* e) = 0;
     virtual Tn_VerilogStatement* caseItemBegin(Tn_VerilogStatement* c, const Tn_VerilogTok& first) = 0;
     virtual void caseItemExpression(Tn_VerilogStatement* item, Tn_VerilogExpression* e) = 0;
-    virtual void caseItemBody(Tn_VerilogStatement* item, Tn_VerilogStatement* s) = 0;
+    virtual void caseItemBody(Tn_VerilogStatement* c, Tn_VerilogStatement* item, Tn_VerilogStatement* s) = 0;
     virtual Tn_VerilogStatement* forever(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) = 0;
     virtual Tn_VerilogStatement* repeat(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
                                         Tn_VerilogStatement* s) = 0;

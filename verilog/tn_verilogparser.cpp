@@ -422,8 +422,6 @@ struct Tn_VerilogParser::Impl {
     std::vector<NamePart> nameParts;
     std::vector<Select> selects;
     std::vector<TimingArgument> timingArguments;
-    V::EdgeType pathEdge = V::NoEdge;
-    std::vector<Tn_VerilogStatement*> caseStack;
     // Depth of each expression and statement node built, by node id.
     std::vector<uint16_t> depths;
 
@@ -1810,14 +1808,11 @@ Tn_VerilogNode* Tn_VerilogParser::pathBegin(const Tn_VerilogTok& first, Tn_Veril
     p->Polarity = V::NoPolarity;
     p->DataPolarity = V::NoPolarity;
     d.module->Path.push_back(p);
-    d.pathEdge = V::NoEdge;
     return p;
 }
 
-void Tn_VerilogParser::pathEdge(Tn_VerilogNode*, int edge) { d_->pathEdge = edgeType(edge); }
-
-void Tn_VerilogParser::pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e) {
-    static_cast<Tn_VerilogPath*>(p)->Input.push_back(pathTerm(*d_, e, V::InputPort, d_->pathEdge));
+void Tn_VerilogParser::pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e, int edge) {
+    static_cast<Tn_VerilogPath*>(p)->Input.push_back(pathTerm(*d_, e, V::InputPort, edgeType(edge)));
 }
 
 void Tn_VerilogParser::pathPolarity(Tn_VerilogNode* p, int sign, bool data) {
@@ -2116,7 +2111,6 @@ void Tn_VerilogParser::caseSelector(Tn_VerilogStatement* c, Tn_VerilogExpression
 Tn_VerilogStatement* Tn_VerilogParser::caseItemBegin(Tn_VerilogStatement* c, const Tn_VerilogTok& first) {
     Tn_VerilogCaseItem* i = d_->f().createCaseItem((first).location);
     static_cast<Tn_VerilogCase*>(c)->CaseItem.push_back(i);
-    d_->caseStack.push_back(c);
     return i;
 }
 
@@ -2125,12 +2119,11 @@ void Tn_VerilogParser::caseItemExpression(Tn_VerilogStatement* item, Tn_VerilogE
     deepen(*d_, item, e);
 }
 
-void Tn_VerilogParser::caseItemBody(Tn_VerilogStatement* item, Tn_VerilogStatement* s) {
+void Tn_VerilogParser::caseItemBody(Tn_VerilogStatement* c, Tn_VerilogStatement* item, Tn_VerilogStatement* s) {
     Impl& d = *d_;
     static_cast<Tn_VerilogCaseItem*>(item)->Statement = s;
     deepen(d, item, s);
-    deepen(d, d.caseStack.back(), item);
-    d.caseStack.pop_back();
+    deepen(d, c, item);
 }
 
 Tn_VerilogStatement* Tn_VerilogParser::forever(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a,

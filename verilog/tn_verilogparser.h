@@ -154,8 +154,7 @@ protected:
     void pulseControlOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
     Tn_VerilogNode* pathBegin(const Tn_VerilogTok& first, Tn_VerilogAttributes* a, Tn_VerilogExpression* condition,
                               bool ifnone) override;
-    void pathEdge(Tn_VerilogNode* p, int edge) override;
-    void pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
+    void pathInput(Tn_VerilogNode* p, Tn_VerilogExpression* e, int edge) override;
     void pathPolarity(Tn_VerilogNode* p, int sign, bool data) override;
     void pathType(Tn_VerilogNode* p, int type) override;
     void pathOutput(Tn_VerilogNode* p, Tn_VerilogExpression* e) override;
@@ -196,7 +195,7 @@ protected:
     void caseSelector(Tn_VerilogStatement* c, Tn_VerilogExpression* e) override;
     Tn_VerilogStatement* caseItemBegin(Tn_VerilogStatement* c, const Tn_VerilogTok& first) override;
     void caseItemExpression(Tn_VerilogStatement* item, Tn_VerilogExpression* e) override;
-    void caseItemBody(Tn_VerilogStatement* item, Tn_VerilogStatement* s) override;
+    void caseItemBody(Tn_VerilogStatement* c, Tn_VerilogStatement* item, Tn_VerilogStatement* s) override;
     Tn_VerilogStatement* forever(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogStatement* s) override;
     Tn_VerilogStatement* repeat(const Tn_VerilogTok& keyword, Tn_VerilogAttributes* a, Tn_VerilogExpression* e,
                                 Tn_VerilogStatement* s) override;
