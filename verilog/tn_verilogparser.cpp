@@ -437,6 +437,11 @@ struct Tn_VerilogParser::Impl {
     uint16_t depthOf(const Tn_VerilogNode* n) const {
         return n && n->id() < depths.size() ? depths[n->id()] : 0;
     }
+    // Node ids are numbered per unit, and so are the depths kept by id.
+    void useFactory(Tn_VerilogNodeFactory* f) {
+        factory = f;
+        depths.clear();
+    }
 };
 
 // ----------------------------------------------------------- construction
@@ -490,7 +495,7 @@ void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn
     d.filter.lexer().startFiles(files);
     clearLookahead();
     d.scratch.reset(new Tn_VerilogDesignUnit(library.name(), Port_String(), d.options));
-    d.factory = &d.scratch->factory();
+    d.useFactory(&d.scratch->factory());
     try {
         sourceText();
     } catch (const antlr::TokenStreamRecognitionException& e) {
@@ -508,7 +513,7 @@ void Tn_VerilogParser::parse(const Tn_StringList& files, Tn_Library& library, Tn
     d.scopes.clear();
     d.namesArena.clear();
     d.scratch.reset();
-    d.factory = nullptr;
+    d.useFactory(nullptr);
     d.parsed.clear();
     d.library = nullptr;
     d.compiled = nullptr;
@@ -530,7 +535,7 @@ Tn_VerilogExpression* Tn_VerilogParser::readExpression(Tn_VerilogNodeFactory& fa
     Impl& d = *d_;
     verilog2001_ = d.options.verilog2001() != 0;
     resetNesting();
-    d.factory = &factory;
+    d.useFactory(&factory);
     std::string message;
     try {
         return singleExpression();
@@ -811,7 +816,7 @@ void checkUnitName(Impl& d, const Tn_Symbol& name, const Tn_Location& loc) {
 
 void startUnit(Impl& d, const Tn_Symbol& name, int32_t kind) {
     d.unit.reset(new Tn_VerilogDesignUnit(d.library->name(), name, d.options, kind));
-    d.factory = &d.unit->factory();
+    d.useFactory(&d.unit->factory());
     d.unit->setRoot(d.f().createRoot());
     d.scopes.clear();
     d.namesArena.clear();
@@ -822,7 +827,6 @@ void startUnit(Impl& d, const Tn_Symbol& name, int32_t kind) {
     d.constantCallSet.clear();
     d.callsInFunctions.clear();
     d.functionDepth = 0;
-    d.depths.clear();
     d.udpPorts.clear();
     d.udpHasInitial = false;
 }
@@ -849,7 +853,7 @@ void finishUnit(Impl& d, const char* status) {
     if (d.parsed[d.library->name()].insert(name).second && d.compiled) d.compiled->push_back(name);
     d.module = nullptr;
     d.udp = nullptr;
-    d.factory = &d.scratch->factory();
+    d.useFactory(&d.scratch->factory());
 }
 
 // Attribute pragma comments (+pls_client) for the module: each names an
