@@ -42,14 +42,13 @@ bool acceptsReal(int32_t op) {
     }
 }
 
-uint32_t atLeast(uint32_t a, uint32_t b) { return a > b ? a : b; }
 
 }  // namespace
 
 Tn_VerilogTypePtr Tn_VerilogBinaryOp::typeAs(Tn_VerilogElabContext& ctx, ValueType) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    Tn_VerilogTypePtr l = LOperand ? LOperand->typeAs(ctx, Value) : Tn_VerilogType::createError();
-    Tn_VerilogTypePtr r = ROperand ? ROperand->typeAs(ctx, Value) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr l = typeOf(LOperand, ctx);
+    Tn_VerilogTypePtr r = typeOf(ROperand, ctx);
     if (l->isError() || r->isError()) return Tn_VerilogType::createError();
     const bool real = l->isRealType() || r->isRealType();
     if (!l->isValueType() || !r->isValueType() || (real && !acceptsReal(OpType))) {
@@ -84,7 +83,7 @@ Tn_VerilogValuePtr Tn_VerilogBinaryOp::evaluate(const Tn_VerilogEvalContext& ctx
             return op(LOperand->evaluate(self), ROperand->evaluate(self), ctx);
         // Operands sized to each other, signed only when both are.
         const Tn_VerilogEvalContext inner = ctx.sized(LOperand->isSigned(true) && ROperand->isSigned(true),
-                                                      atLeast(LOperand->contextWidth(0), ROperand->contextWidth(0)));
+                                                      std::max<uint32_t>(LOperand->contextWidth(0), ROperand->contextWidth(0)));
         if (inner.tooWide()) return Tn_VerilogValue::createNull();
         return op(LOperand->evaluate(inner), ROperand->evaluate(inner), ctx);
     }
@@ -106,9 +105,9 @@ Tn_VerilogValuePtr Tn_VerilogBinaryOp::evaluate(const Tn_VerilogEvalContext& ctx
 uint32_t Tn_VerilogBinaryOp::contextWidth(uint32_t width) const {
     if (!LOperand || !ROperand) return width;
     switch (groupOf(OpType)) {
-    case Comparison: return atLeast(width, 1);
+    case Comparison: return std::max<uint32_t>(width, 1);
     case LeftOperand: return LOperand->contextWidth(width);
-    default: return atLeast(LOperand->contextWidth(width), ROperand->contextWidth(width));
+    default: return std::max<uint32_t>(LOperand->contextWidth(width), ROperand->contextWidth(width));
     }
 }
 

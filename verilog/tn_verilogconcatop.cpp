@@ -26,7 +26,7 @@ bool checkOperands(Tn_VerilogElabContext& ctx, const Tn_NodeList<Tn_VerilogExpre
                    const Tn_VerilogNode& op, const char* message) {
     bool failed = false, illegal = operands.empty();
     for (Tn_VerilogExpression* e : operands) {
-        Tn_VerilogTypePtr t = e ? e->typeAs(ctx, use) : Tn_VerilogType::createError();
+        Tn_VerilogTypePtr t = Tn_VerilogExpression::typeOf(e, ctx, use);
         if (t->isError()) failed = true;
         else if (!t->isIntegral()) illegal = true;
     }
@@ -108,7 +108,7 @@ Tn_VerilogTypePtr Tn_VerilogMultipleConcatOp::typeAs(Tn_VerilogElabContext& ctx,
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     const Port_String loc = locationText();
     bool failed = false;
-    Tn_VerilogTypePtr t = Count ? Count->typeAs(ctx, Value) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr t = typeOf(Count, ctx);
     if (t->isError()) {
         failed = true;
     } else if (!t->isIntegral()) {

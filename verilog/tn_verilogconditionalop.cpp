@@ -8,15 +8,15 @@ Tn_VerilogTypePtr Tn_VerilogConditionalOp::typeAs(Tn_VerilogElabContext& ctx, Va
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     const Port_String loc = locationText();
     bool failed = false;
-    Tn_VerilogTypePtr c = Condition ? Condition->typeAs(ctx, Value) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr c = typeOf(Condition, ctx);
     if (c->isError()) {
         failed = true;
     } else if (!c->isValueType()) {
         TN_MSG().issueError("%sIllegal condition operand of conditional operator '?:'\n", loc.c_str());
         failed = true;
     }
-    Tn_VerilogTypePtr t = TrueOperand ? TrueOperand->typeAs(ctx, Value) : Tn_VerilogType::createError();
-    Tn_VerilogTypePtr f = FalseOperand ? FalseOperand->typeAs(ctx, Value) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr t = typeOf(TrueOperand, ctx);
+    Tn_VerilogTypePtr f = typeOf(FalseOperand, ctx);
     if (t->isError() || f->isError()) return Tn_VerilogType::createError();
     if (!t->isValueType() || !f->isValueType()) {
         TN_MSG().issueError("%sIllegal operand of conditional operator '?:'\n", loc.c_str());

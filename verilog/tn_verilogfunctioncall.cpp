@@ -1,5 +1,6 @@
 // Calls of system and user functions: the call checks, sizes and signs from
 // the callee's result, and the copies that parameter values may not hold.
+#include <algorithm>
 #include <cctype>
 
 #include "util/tn_message.h"
@@ -12,7 +13,6 @@ using namespace Tn_Verilog;
 
 namespace {
 
-uint32_t atLeast(uint32_t a, uint32_t b) { return a > b ? a : b; }
 
 std::vector<Tn_VerilogExpression*> argumentsOf(const Tn_NodeList<Tn_VerilogExpression>& params) {
     std::vector<Tn_VerilogExpression*> list;
@@ -77,8 +77,8 @@ Tn_VerilogExpression* Tn_VerilogSystemFunctionCall::copyAs(Tn_VerilogElabContext
 
 uint32_t Tn_VerilogSystemFunctionCall::contextWidth(uint32_t width) const {
     if ((Name == "$signed" || Name == "$unsigned") && Param.size() == 1 && Param[0])
-        return atLeast(Param[0]->contextWidth(0), width);
-    return atLeast(resultKind() == 0 ? 32 : 64, width);
+        return std::max<uint32_t>(Param[0]->contextWidth(0), width);
+    return std::max<uint32_t>(resultKind() == 0 ? 32 : 64, width);
 }
 
 bool Tn_VerilogSystemFunctionCall::isSigned(bool contextSigned) const {
@@ -144,7 +144,7 @@ Tn_VerilogValuePtr Tn_VerilogUserFunctionCall::evaluate(const Tn_VerilogEvalCont
 
 uint32_t Tn_VerilogUserFunctionCall::contextWidth(uint32_t width) const {
     Tn_VerilogFunction* f = function();
-    return f ? atLeast(f->width(), width) : width;
+    return f ? std::max<uint32_t>(f->width(), width) : width;
 }
 
 bool Tn_VerilogUserFunctionCall::isReal() const {

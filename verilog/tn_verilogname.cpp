@@ -1,5 +1,7 @@
 // Names: resolution by upward search, hierarchical and indexed names, the
 // checks of a reference, and the properties of what a name denotes.
+#include <algorithm>
+
 #include "util/tn_message.h"
 #include "verilog/tn_verilogelabcontext.h"
 #include "verilog/tn_verilognodes.h"
@@ -14,7 +16,6 @@ public:
     void reference(const Tn_FieldInfo&, Tn_VerilogNode*& n) override { n = nullptr; }
 };
 
-uint32_t atLeast(uint32_t a, uint32_t b) { return a > b ? a : b; }
 
 // The index of an indexed name; false when it is not a defined constant.
 bool indexOf(const Tn_VerilogExpression* e, int32_t& index) {
@@ -122,7 +123,7 @@ Tn_VerilogValuePtr Tn_VerilogName::evaluate(const Tn_VerilogEvalContext& ctx) co
 
 uint32_t Tn_VerilogName::contextWidth(uint32_t width) const {
     Tn_VerilogDeclaration* d = declaration();
-    return d ? atLeast(d->width(), width) : width;
+    return d ? std::max<uint32_t>(d->width(), width) : width;
 }
 
 bool Tn_VerilogName::isReal() const {

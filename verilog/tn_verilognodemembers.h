@@ -328,6 +328,11 @@ public:
     Tn_VerilogTypePtr checkLValue(Tn_VerilogElabContext& ctx) { return typeAs(ctx, Tn_Verilog::LValue); } \
     Tn_VerilogTypePtr checkNetLValue(Tn_VerilogElabContext& ctx) { return typeAs(ctx, Tn_Verilog::NetLValue); } \
     Tn_VerilogTypePtr checkVarLValue(Tn_VerilogElabContext& ctx) { return typeAs(ctx, Tn_Verilog::VarLValue); } \
+    /* An operand's type for a use; the error type, silently, for a missing one. */                  \
+    static Tn_VerilogTypePtr typeOf(Tn_VerilogExpression* e, Tn_VerilogElabContext& ctx,               \
+                                    Tn_Verilog::ValueType use = Tn_Verilog::Value) {                   \
+        return e ? e->typeAs(ctx, use) : Tn_VerilogType::createError();                               \
+    }                                                                                                 \
     Tn_VerilogExpression* elaborateCopy(Tn_VerilogElabContext& ctx) { return copyAs(ctx, TN_COPY_PLAIN); } \
     Tn_VerilogExpression* elaborateInParameter(Tn_VerilogElabContext& ctx) { return copyAs(ctx, TN_COPY_PARAMETER); } \
     Tn_VerilogExpression* elaborateInSpecparam(Tn_VerilogElabContext& ctx) { return copyAs(ctx, TN_COPY_SPECPARAM); } \

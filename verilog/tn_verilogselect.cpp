@@ -1,5 +1,6 @@
 // Bit-, part-, indexed part- and word-selects: their checks and, for the
 // first three, constant evaluation by the declared bit numbering.
+#include <algorithm>
 #include <cstdint>
 
 #include "util/tn_message.h"
@@ -10,7 +11,6 @@ using namespace Tn_Verilog;
 
 namespace {
 
-uint32_t atLeast(uint32_t a, uint32_t b) { return a > b ? a : b; }
 
 // Declared bounds of a select's operand: its own, else those of its value.
 struct Bounds {
@@ -91,7 +91,7 @@ Tn_VerilogValuePtr selectRange(const Tn_VerilogOperand* operand, const Tn_Verilo
 // a message (or when its own check failed).
 bool checkSelected(Tn_VerilogElabContext& ctx, Tn_VerilogOperand* operand, ValueType use, const Tn_VerilogNode& select,
                    const char* illegal) {
-    Tn_VerilogTypePtr t = operand ? operand->typeAs(ctx, use) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr t = Tn_VerilogExpression::typeOf(operand, ctx, use);
     if (t->isError()) return false;
     if (!t->isIntegral()) {
         TN_MSG().issueError(illegal, select.locationText().c_str(), operand->describe().c_str());
@@ -161,7 +161,7 @@ Tn_VerilogValuePtr Tn_VerilogBitSelect::evaluate(const Tn_VerilogEvalContext& ct
     return Tn_VerilogValue::fit(bitsAt(v->toVector(), b.offset(index.value), 1), ctx);
 }
 
-uint32_t Tn_VerilogBitSelect::contextWidth(uint32_t width) const { return atLeast(1, width); }
+uint32_t Tn_VerilogBitSelect::contextWidth(uint32_t width) const { return std::max<uint32_t>(1, width); }
 
 bool Tn_VerilogBitSelect::isConstant() const { return Operand && Index && Operand->isConstant() && Index->isConstant(); }
 bool Tn_VerilogBitSelect::isNetLValue() const { return Operand && Operand->isNetLValue(); }
@@ -205,7 +205,7 @@ Tn_VerilogValuePtr Tn_VerilogPartSelect::evaluate(const Tn_VerilogEvalContext& c
 
 uint32_t Tn_VerilogPartSelect::contextWidth(uint32_t width) const {
     const IndexValue m = indexValue(Msb), l = indexValue(Lsb);
-    if (m.state != IndexValue::Defined || l.state != IndexValue::Defined) return atLeast(1, width);
+    if (m.state != IndexValue::Defined || l.state != IndexValue::Defined) return std::max<uint32_t>(1, width);
     const uint64_t own = static_cast<uint64_t>(m.value > l.value ? m.value - l.value : l.value - m.value) + 1;
     return own > width ? static_cast<uint32_t>(own > UINT32_MAX ? UINT32_MAX : own) : width;
 }
@@ -260,8 +260,8 @@ Tn_VerilogValuePtr Tn_VerilogIndexedPartSelect::evaluate(const Tn_VerilogEvalCon
 
 uint32_t Tn_VerilogIndexedPartSelect::contextWidth(uint32_t width) const {
     const IndexValue w = indexValue(Width);
-    if (w.state != IndexValue::Defined || w.value <= 0) return atLeast(1, width);
-    return atLeast(w.value > UINT32_MAX ? UINT32_MAX : static_cast<uint32_t>(w.value), width);
+    if (w.state != IndexValue::Defined || w.value <= 0) return std::max<uint32_t>(1, width);
+    return std::max<uint32_t>(w.value > UINT32_MAX ? UINT32_MAX : static_cast<uint32_t>(w.value), width);
 }
 
 bool Tn_VerilogIndexedPartSelect::isConstant() const {
@@ -278,7 +278,7 @@ Port_String Tn_VerilogIndexedPartSelect::describe() const {
 Tn_VerilogTypePtr Tn_VerilogWordSelect::typeAs(Tn_VerilogElabContext& ctx, ValueType use) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     const Port_String loc = locationText();
-    Tn_VerilogTypePtr t = Operand ? Operand->typeAs(ctx, Value) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr t = typeOf(Operand, ctx);
     if (t->isError()) return t;
     const Port_String target = Operand->describe();
     if (Operand->declarationAs<Tn_VerilogParameter>()) {
@@ -327,7 +327,7 @@ Tn_VerilogValuePtr Tn_VerilogWordSelect::evaluate(const Tn_VerilogEvalContext& c
 
 uint32_t Tn_VerilogWordSelect::contextWidth(uint32_t width) const {
     Tn_VerilogDeclaration* d = Operand ? Operand->declaration() : nullptr;
-    return d ? atLeast(d->width(), width) : width;
+    return d ? std::max<uint32_t>(d->width(), width) : width;
 }
 
 bool Tn_VerilogWordSelect::isSigned(bool contextSigned) const {

@@ -8,7 +8,7 @@ bool Tn_VerilogUnaryOp::isBitResult() const { return OpType != Identity && OpTyp
 
 Tn_VerilogTypePtr Tn_VerilogUnaryOp::typeAs(Tn_VerilogElabContext& ctx, ValueType) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    Tn_VerilogTypePtr t = Operand ? Operand->typeAs(ctx, Value) : Tn_VerilogType::createError();
+    Tn_VerilogTypePtr t = typeOf(Operand, ctx);
     if (t->isError()) return t;
     const bool realAllowed = OpType == Identity || OpType == Negation || OpType == LogicalNegation;
     if (!t->isValueType() || (t->isRealType() && !realAllowed)) {
