@@ -45,18 +45,17 @@ bool Tn_VerilogCallChecker::check(const Tn_VerilogNode& call, const Port_String&
     for (size_t i = 0; i < fixed; ++i)
         if (!params[i]->isOptional()) required = i + 1;
 
-    const Port_String loc = call.locationText();
     bool ok = true;
     for (size_t i = 0; i < arguments.size(); ++i) {
         const Tn_VerilogType* param = i < fixed ? params[i].get() : tail;
         if (!param) {
-            TN_MSG().issueError(messages_.tooMany, loc.c_str(), name.c_str());
+            TN_MSG().issueError(messages_.tooMany, call.locationText().c_str(), name.c_str());
             return false;
         }
         if (!checkArgument(call, name, arguments[i], *param, static_cast<int>(i + 1))) ok = false;
     }
     if (arguments.size() < required) {
-        TN_MSG().issueError(messages_.tooFew, loc.c_str(), name.c_str());
+        TN_MSG().issueError(messages_.tooFew, call.locationText().c_str(), name.c_str());
         return false;
     }
     return ok;
@@ -64,19 +63,18 @@ bool Tn_VerilogCallChecker::check(const Tn_VerilogNode& call, const Port_String&
 
 bool Tn_VerilogCallChecker::checkArgument(const Tn_VerilogNode& call, const Port_String& name,
                                           Tn_VerilogExpression* argument, const Tn_VerilogType& param, int number) {
-    const Port_String loc = call.locationText();
     const bool empty = !argument || argument->isA(Tn_Verilog::NullOp);
     if (param.direction() == Tn_VerilogType::NoDirection) {
         // An ellipses without a direction takes any value or declared object.
         if (!param.isEllipses()) {
-            TN_MSG().issueError(messages_.noDirection, loc.c_str(), number, name.c_str());
+            TN_MSG().issueError(messages_.noDirection, call.locationText().c_str(), number, name.c_str());
             return false;
         }
         if (empty) return true;
         Tn_VerilogTypePtr t = argument->typeAs(ctx_, Tn_Verilog::Value);
         if (t->isError()) return false;
         if (!t->isValueType() && !argument->object()) {
-            TN_MSG().issueError(messages_.illegal, loc.c_str(), number, name.c_str());
+            TN_MSG().issueError(messages_.illegal, call.locationText().c_str(), number, name.c_str());
             return false;
         }
         return true;
@@ -84,14 +82,14 @@ bool Tn_VerilogCallChecker::checkArgument(const Tn_VerilogNode& call, const Port
     const char* direction = param.directionText();
     if (empty) {
         if (param.isOptional() || param.acceptsAny()) return true;
-        TN_MSG().issueError(messages_.illegalDirected, loc.c_str(), number, direction, name.c_str());
+        TN_MSG().issueError(messages_.illegalDirected, call.locationText().c_str(), number, direction, name.c_str());
         return false;
     }
     if (param.isInput()) {
         Tn_VerilogTypePtr t = argument->typeAs(ctx_, Tn_Verilog::Value);
         if (t->isError()) return false;
         if (param.acceptsAny() || param.matches(*t)) return true;
-        TN_MSG().issueError(messages_.illegalDirected, loc.c_str(), number, direction, name.c_str());
+        TN_MSG().issueError(messages_.illegalDirected, call.locationText().c_str(), number, direction, name.c_str());
         return false;
     }
     // Outputs and inouts receive a value: a variable, or for a parameter that
@@ -105,6 +103,6 @@ bool Tn_VerilogCallChecker::checkArgument(const Tn_VerilogNode& call, const Port
         if (t->isError()) return false;
         if (argument->isVarLValue() && param.matches(*t)) return true;
     }
-    TN_MSG().issueError(messages_.illegalDirected, loc.c_str(), number, direction, name.c_str());
+    TN_MSG().issueError(messages_.illegalDirected, call.locationText().c_str(), number, direction, name.c_str());
     return false;
 }

@@ -106,17 +106,16 @@ int64_t Tn_VerilogMultipleConcatOp::countValue() const {
 
 Tn_VerilogTypePtr Tn_VerilogMultipleConcatOp::typeAs(Tn_VerilogElabContext& ctx, ValueType) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    const Port_String loc = locationText();
     bool failed = false;
     Tn_VerilogTypePtr t = typeOf(Count, ctx);
     if (t->isError()) {
         failed = true;
     } else if (!t->isIntegral()) {
-        TN_MSG().issueError("%sIllegal count operand of multiple concatenation operator\n", loc.c_str());
+        TN_MSG().issueError("%sIllegal count operand of multiple concatenation operator\n", locationText().c_str());
         failed = true;
     } else if (!Count->isConstant()) {
         TN_MSG().issueError("%sRepetition multiplier of multiple concatenation operator should be constant\n",
-                            loc.c_str());
+                            locationText().c_str());
         failed = true;
     } else {
         Tn_VerilogValuePtr v = Count->evaluate(Tn_VerilogEvalContext::quiet());
@@ -125,7 +124,7 @@ Tn_VerilogTypePtr Tn_VerilogMultipleConcatOp::typeAs(Tn_VerilogElabContext& ctx,
         else if (v->hasUnknown()) problem = "is undefined";
         else if (v->isSigned() && v->toVector().isNegative()) problem = "is negative";
         if (problem) {
-            TN_MSG().issueError("%sCount operand of multiple concatenation operator %s\n", loc.c_str(), problem);
+            TN_MSG().issueError("%sCount operand of multiple concatenation operator %s\n", locationText().c_str(), problem);
             failed = true;
         }
     }

@@ -6,20 +6,19 @@ using namespace Tn_Verilog;
 
 Tn_VerilogTypePtr Tn_VerilogConditionalOp::typeAs(Tn_VerilogElabContext& ctx, ValueType) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    const Port_String loc = locationText();
     bool failed = false;
     Tn_VerilogTypePtr c = typeOf(Condition, ctx);
     if (c->isError()) {
         failed = true;
     } else if (!c->isValueType()) {
-        TN_MSG().issueError("%sIllegal condition operand of conditional operator '?:'\n", loc.c_str());
+        TN_MSG().issueError("%sIllegal condition operand of conditional operator '?:'\n", locationText().c_str());
         failed = true;
     }
     Tn_VerilogTypePtr t = typeOf(TrueOperand, ctx);
     Tn_VerilogTypePtr f = typeOf(FalseOperand, ctx);
     if (t->isError() || f->isError()) return Tn_VerilogType::createError();
     if (!t->isValueType() || !f->isValueType()) {
-        TN_MSG().issueError("%sIllegal operand of conditional operator '?:'\n", loc.c_str());
+        TN_MSG().issueError("%sIllegal operand of conditional operator '?:'\n", locationText().c_str());
         return Tn_VerilogType::createError();
     }
     if (failed) return Tn_VerilogType::createError();

@@ -53,13 +53,12 @@ int32_t Tn_VerilogSystemFunctionCall::resultKind() const {
 
 Tn_VerilogTypePtr Tn_VerilogSystemFunctionCall::typeAs(Tn_VerilogElabContext& ctx, ValueType) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    const Port_String loc = locationText();
     const Tn_VerilogType* entry = Tn_VerilogSysTf::function(Name, ctx.verilog2001());
     if (!entry) {
         if (Tn_VerilogSysTf::task(Name, ctx.verilog2001()))
-            TN_MSG().issueError("%sCall to system function '%s' is unsupported\n", loc.c_str(), Name.c_str());
+            TN_MSG().issueError("%sCall to system function '%s' is unsupported\n", locationText().c_str(), Name.c_str());
         else
-            TN_MSG().issueError("%sIllegal call to unknown system function '%s'\n", loc.c_str(), Name.c_str());
+            TN_MSG().issueError("%sIllegal call to unknown system function '%s'\n", locationText().c_str(), Name.c_str());
         return Tn_VerilogType::createError();
     }
     Tn_VerilogCallChecker checker(ctx, Tn_VerilogCallChecker::kSystemFunction);

@@ -55,16 +55,15 @@ bool checkScopeIndices(Tn_VerilogElabContext& ctx, Tn_VerilogNode* n) {
 Tn_VerilogTypePtr Tn_VerilogName::typeAs(Tn_VerilogElabContext& ctx, ValueType use) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     if (!checkScopeIndices(ctx, this)) return Tn_VerilogType::createError();
-    const Port_String loc = locationText();
     Tn_VerilogDeclaration* d = resolve(ctx.scope());
     if (!d) {
-        TN_MSG().issueError("%sName '%s' could not be resolved\n", loc.c_str(), nameText().c_str());
+        TN_MSG().issueError("%sName '%s' could not be resolved\n", locationText().c_str(), nameText().c_str());
         return Tn_VerilogType::createError();
     }
     // A genvar has a value only while its loop is unrolled (or in the loop's elements).
     if (Tn_VerilogGenVar* g = Tn_VerilogNode::cast<Tn_VerilogGenVar>(d)) {
         if (!g->ValidFlag && !ctx.isActiveGenVar(g)) {
-            TN_MSG().issueError("%sIllegal reference to genvar '%s'\n", loc.c_str(), g->Name.c_str());
+            TN_MSG().issueError("%sIllegal reference to genvar '%s'\n", locationText().c_str(), g->Name.c_str());
             return Tn_VerilogType::createError();
         }
     }
@@ -83,7 +82,7 @@ Tn_VerilogTypePtr Tn_VerilogName::typeAs(Tn_VerilogElabContext& ctx, ValueType u
     default: break;
     }
     if (problem) {
-        TN_MSG().issueError(problem, loc.c_str(), describe().c_str());
+        TN_MSG().issueError(problem, locationText().c_str(), describe().c_str());
         return Tn_VerilogType::createError();
     }
     // Inside a function its name is the result variable.

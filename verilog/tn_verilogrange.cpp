@@ -22,7 +22,6 @@ bool checkBound(Tn_VerilogElabContext& ctx, Tn_VerilogExpression* e, const char*
     if (!e) return true;
     Tn_VerilogTypePtr t = e->typeAs(ctx, Tn_Verilog::Value);
     if (t->isError()) return false;
-    const Port_String loc = range.locationText();
     const char* problem = nullptr;
     Tn_VerilogValuePtr v;
     if (t->isRealType()) {
@@ -42,7 +41,7 @@ bool checkBound(Tn_VerilogElabContext& ctx, Tn_VerilogExpression* e, const char*
         problem = "is undefined";
     }
     if (!problem) return true;
-    TN_MSG().issueError("%s%s of range specification %s\n", loc.c_str(), which, problem);
+    TN_MSG().issueError("%s%s of range specification %s\n", range.locationText().c_str(), which, problem);
     return false;
 }
 

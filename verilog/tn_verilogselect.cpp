@@ -101,12 +101,13 @@ bool checkSelected(Tn_VerilogElabContext& ctx, Tn_VerilogOperand* operand, Value
 }
 
 // The checks of one index operand. Messages are made of the prefix (the
-// operand's part in the select, "Index in bit-select of %s"), the operand's
-// description and the problem. False after a message.
+// operand's part in the select, "Index in bit-select of %s"), the selected
+// operand's description and the problem; they are formatted only when
+// issued. False after a message.
 class IndexCheck {
 public:
-    IndexCheck(Tn_VerilogElabContext& ctx, const Tn_VerilogNode& select, const Port_String& target)
-        : ctx_(ctx), loc_(select.locationText()), target_(target) {}
+    IndexCheck(Tn_VerilogElabContext& ctx, const Tn_VerilogNode& select, const Tn_VerilogOperand& target)
+        : ctx_(ctx), select_(select), target_(target) {}
 
     // An integral operand; constant when required. Sets index.
     bool check(Tn_VerilogExpression* e, const char* prefix, bool mustBeConstant, bool constantOnly, IndexValue& index) {
@@ -122,14 +123,15 @@ public:
         return true;
     }
     bool report(const char* prefix, const char* problem) {
-        TN_MSG().issueError("%s%s %s\n", loc_.c_str(), Port_String::doFormat(prefix, target_.c_str()).c_str(), problem);
+        TN_MSG().issueError("%s%s %s\n", select_.locationText().c_str(),
+                            Port_String::doFormat(prefix, target_.describe().c_str()).c_str(), problem);
         return false;
     }
 
 private:
     Tn_VerilogElabContext& ctx_;
-    Port_String loc_;
-    Port_String target_;
+    const Tn_VerilogNode& select_;
+    const Tn_VerilogOperand& target_;
 };
 
 }  // namespace
@@ -139,7 +141,7 @@ private:
 Tn_VerilogTypePtr Tn_VerilogBitSelect::typeAs(Tn_VerilogElabContext& ctx, ValueType use) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     if (!checkSelected(ctx, Operand, use, *this, "%sBit-select of %s is illegal\n")) return Tn_VerilogType::createError();
-    IndexCheck c(ctx, *this, Operand->describe());
+    IndexCheck c(ctx, *this, *Operand);
     IndexValue index;
     if (!c.check(Index, "Index in bit-select of %s", use == NetLValue, false, index)) return Tn_VerilogType::createError();
     Bounds b(Operand);
@@ -173,7 +175,7 @@ Port_String Tn_VerilogBitSelect::describe() const { return "bit-select of " + (O
 Tn_VerilogTypePtr Tn_VerilogPartSelect::typeAs(Tn_VerilogElabContext& ctx, ValueType use) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     if (!checkSelected(ctx, Operand, use, *this, "%sPart-select of %s is illegal\n")) return Tn_VerilogType::createError();
-    IndexCheck c(ctx, *this, Operand->describe());
+    IndexCheck c(ctx, *this, *Operand);
     const char* const msbPrefix = "Most significant bit operand in part-select of %s";
     const char* const lsbPrefix = "Least significant bit operand in part-select of %s";
     IndexValue m, l;
@@ -223,7 +225,7 @@ Tn_VerilogTypePtr Tn_VerilogIndexedPartSelect::typeAs(Tn_VerilogElabContext& ctx
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
     if (!checkSelected(ctx, Operand, use, *this, "%sIndexed part-select of %s is illegal\n"))
         return Tn_VerilogType::createError();
-    IndexCheck c(ctx, *this, Operand->describe());
+    IndexCheck c(ctx, *this, *Operand);
     const char* const basePrefix = "Base operand in indexed part-select of %s";
     const char* const widthPrefix = "Width operand in indexed part-select of %s";
     IndexValue base, width;
@@ -277,25 +279,23 @@ Port_String Tn_VerilogIndexedPartSelect::describe() const {
 
 Tn_VerilogTypePtr Tn_VerilogWordSelect::typeAs(Tn_VerilogElabContext& ctx, ValueType use) {
     if (!checkAttributes(ctx)) return Tn_VerilogType::createError();
-    const Port_String loc = locationText();
     Tn_VerilogTypePtr t = typeOf(Operand, ctx);
     if (t->isError()) return t;
-    const Port_String target = Operand->describe();
     if (Operand->declarationAs<Tn_VerilogParameter>()) {
-        TN_MSG().issueError("%sParameters cannot be indexed as an array\n", loc.c_str());
+        TN_MSG().issueError("%sParameters cannot be indexed as an array\n", locationText().c_str());
         return Tn_VerilogType::createError();
     }
     // One index per dimension.
     std::vector<Tn_VerilogTypePtr> dimensions;
     for (Tn_VerilogTypePtr a = t; a && a->isArray(); a = a->elementType()) dimensions.push_back(a);
     if (dimensions.empty() || dimensions.size() != Index.size()) {
-        TN_MSG().issueError("%sWord-select of %s is illegal\n", loc.c_str(), target.c_str());
+        TN_MSG().issueError("%sWord-select of %s is illegal\n", locationText().c_str(), Operand->describe().c_str());
         return Tn_VerilogType::createError();
     }
     bool ok = true;
     for (size_t i = 0; i < Index.size(); ++i) {
         const Port_String prefix = Port_String::doFormat("Index %d in word-select of %%s", static_cast<int>(i + 1));
-        IndexCheck c(ctx, *this, target);
+        IndexCheck c(ctx, *this, *Operand);
         IndexValue index;
         if (!c.check(Index[i], prefix.c_str(), use == NetLValue, false, index)) {
             ok = false;
@@ -312,7 +312,7 @@ Tn_VerilogTypePtr Tn_VerilogWordSelect::typeAs(Tn_VerilogElabContext& ctx, Value
     else if (use == NetLValue && !isNetLValue()) problem = "%sReference to %s is not a legal net lvalue\n";
     else if (use == VarLValue && !isVarLValue()) problem = "%sReference to %s is not a legal reg or variable lvalue\n";
     if (problem) {
-        TN_MSG().issueError(problem, loc.c_str(), describe().c_str());
+        TN_MSG().issueError(problem, locationText().c_str(), describe().c_str());
         return Tn_VerilogType::createError();
     }
     return dimensions.back()->elementType();
