@@ -218,15 +218,36 @@ private:
     bool entered_;
 };
 
+// The outermost value computation running: overrides and genvar values do
+// not change while it runs, so a parameter's value is computed once in it.
+class EvaluationSession {
+public:
+    EvaluationSession() {
+        if (depth_++ == 0) ++current_;
+    }
+    ~EvaluationSession() { --depth_; }
+    static uint32_t current() { return current_; }
+
+private:
+    static int depth_;
+    static uint32_t current_;
+};
+int EvaluationSession::depth_ = 0;
+uint32_t EvaluationSession::current_ = 0;
+
 template <class P>
-Tn_VerilogValuePtr guardedValue(const P& p, bool& evaluating) {
-    Evaluating guard(evaluating);
+Tn_VerilogValuePtr guardedValue(const P& p, Tn_VerilogParamValueState& state) {
+    EvaluationSession session;
+    if (state.value && state.session == EvaluationSession::current()) return state.value;
+    Evaluating guard(state.evaluating);
     if (!guard.entered()) return Tn_VerilogValue::createNull();
     Tn_VerilogExpression* e = p.valueExpression();
     // The value may be asked for before anything checked the declaration.
     if (e) e->resolveNames(p.Parent);
     if (p.Range) resolveRangeNames(p.Range, p.Parent);
-    return parameterValue(p, e);
+    state.value = parameterValue(p, e);
+    state.session = EvaluationSession::current();
+    return state.value;
 }
 
 template <class P>
@@ -284,7 +305,7 @@ Tn_VerilogTypePtr checkParameter(P& p, Tn_VerilogElabContext& ctx, std::initiali
 }  // namespace
 
 #define TN_PARAMETER_FORWARDS(Class)                                                                     \
-    Tn_VerilogValuePtr Class::value() const { return guardedValue(*this, evaluating_); }                \
+    Tn_VerilogValuePtr Class::value() const { return guardedValue(*this, valueState_); }                \
     Tn_VerilogTypePtr Class::type() const { return parameterType(*this); }                               \
     uint32_t Class::width() const { return parameterWidth(*this); }                                      \
     bool Class::isSigned() const { return parameterIsSigned(*this); }                                    \

@@ -31,6 +31,21 @@ class Tn_VerilogTask;
 // (specparams) and system function calls may not appear.
 enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
 
+// What a parameter keeps while values are computed: the guard against a
+// parameter defined through itself, and its value as computed in the
+// outermost evaluation still running. Widths, signs and values of the names
+// in a parameter's expression each ask for the value of the parameter they
+// name; without the memo a chain of n parameters would cost 3^n evaluations.
+// A copied node starts afresh.
+struct Tn_VerilogParamValueState {
+    Tn_VerilogParamValueState() {}
+    Tn_VerilogParamValueState(const Tn_VerilogParamValueState&) {}
+    Tn_VerilogParamValueState& operator=(const Tn_VerilogParamValueState&) { return *this; }
+    bool evaluating = false;
+    uint32_t session = 0;
+    Tn_VerilogValuePtr value;
+};
+
 // The properties of a type definition, which a declaration answers for its
 // own (1, unsigned, ... unless a class says otherwise).
 #define TN_TYPE_PROPERTIES                                                                            \
@@ -258,9 +273,7 @@ enum Tn_VerilogCopyMode { TN_COPY_PLAIN, TN_COPY_PARAMETER, TN_COPY_SPECPARAM };
     Tn_VerilogExpression* valueExpression() const;                                                    \
                                                                                                       \
 private:                                                                                              \
-    /* Set while the value is computed: a parameter defined through itself */                       \
-    /* has no value instead of recursing. */                                                          \
-    mutable bool evaluating_ = false;                                                                 \
+    mutable Tn_VerilogParamValueState valueState_;                                                    \
                                                                                                       \
 public:
 

@@ -3,6 +3,8 @@
 // names of constants, selects, and what is not constant.
 #include <gtest/gtest.h>
 
+#include <chrono>
+
 #include "tests/support/checkfixture.h"
 
 namespace {
@@ -153,6 +155,21 @@ TEST_F(Eval, WhatIsNotConstantHasNoValue) {
     EXPECT_EQ(eval("undeclared + 1"), "null");
     EXPECT_FALSE(checked("$random")->isConstant());
     EXPECT_TRUE(checked("(1:2:3)")->isConstant());
+}
+
+TEST_F(Eval, ChainsOfParametersEvaluateInLinearTime) {
+    // Each name asks for the width, sign and value of the parameter it
+    // names: computed afresh, a chain of n would cost 3^n evaluations.
+    const auto start = std::chrono::steady_clock::now();
+    b.param(m, "C0", "1");
+    for (int i = 1; i <= 300; ++i) b.param(m, "C" + std::to_string(i), "C" + std::to_string(i - 1) + " + 1");
+    EXPECT_EQ(eval("C300"), "32 s 00000000000000000000000100101101 301");
+    b.param(m, "F0", "1");
+    b.param(m, "F1", "1");
+    for (int i = 2; i <= 40; ++i)
+        b.param(m, "F" + std::to_string(i), "F" + std::to_string(i - 1) + " + F" + std::to_string(i - 2));
+    EXPECT_EQ(eval("F40"), "32 s 00001001110111101000110101101101 165580141");
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(10));
 }
 
 TEST_F(Eval, NamesOfConstantsEvaluateToTheirValues) {
